@@ -1,0 +1,207 @@
+#include "platform/glob/Canvas.h"
+
+#include <algorithm>
+
+#include "platform/glob/CanvasHost.h"
+
+namespace {
+// Below this many children a linear scan beats the grid.
+constexpr size_t kIndexThreshold = 16;
+}  // namespace
+
+Canvas::Canvas(Canvas* parent, CanvasClient* client, const Kw::Box<int>& rectInParent)
+    : client_(client), rect_(rectInParent) {
+  if (parent) attachTo(parent);
+}
+
+Canvas::Canvas(CanvasHost* host, CanvasClient* client, int width, int height)
+    : client_(client), host_(host), rect_(0, 0, width, height) {}
+
+Canvas::~Canvas() {
+  // Children still attached belong to someone else; they become unattached.
+  for (Canvas* c : children_) c->parent_ = nullptr;
+  children_.clear();
+  forgetSubtree();
+  detachFromParent();
+}
+
+void Canvas::attachTo(Canvas* parent) {
+  parent_ = parent;
+  parent_->children_.push_back(this);
+  parent_->childrenChanged();
+  damage();
+}
+
+void Canvas::detachFromParent() {
+  if (!parent_) return;
+  damage();
+  auto& sib = parent_->children_;
+  sib.erase(std::remove(sib.begin(), sib.end(), this), sib.end());
+  parent_->childrenChanged();
+  parent_ = nullptr;
+}
+
+void Canvas::forgetSubtree() {
+  if (CanvasHost* h = host()) h->canvasRemoved(this);
+}
+
+void Canvas::childrenChanged() { indexDirty_ = true; }
+
+XY<int> Canvas::rootOrigin() const {
+  XY<int> o(rect_.x0, rect_.y0);
+  if (isRoot()) return XY<int>(0, 0);
+  for (const Canvas* p = parent_; p && !p->isRoot(); p = p->parent_) {
+    o = o + XY<int>(p->rect_.x0, p->rect_.y0);
+  }
+  return o;
+}
+
+Kw::Box<int> Canvas::rootRect() const {
+  const XY<int> o = rootOrigin();
+  return Kw::Box<int>::fromSize(o.x, o.y, width(), height());
+}
+
+Kw::Box<int> Canvas::visibleRootRect() const {
+  Kw::Box<int> r = rootRect();
+  for (const Canvas* p = parent_; p; p = p->parent_) r = r.intersection(p->rootRect());
+  return r;
+}
+
+void Canvas::reshape(const Kw::Box<int>& rectInParent) {
+  if (rectInParent == rect_) return;
+  damage();
+  rect_ = rectInParent;
+  if (parent_) parent_->childrenChanged();
+  childrenChanged();
+  damage();
+}
+
+void Canvas::translate(int dx, int dy) { reshape(rect_.translated(dx, dy)); }
+
+void Canvas::map() {
+  if (mapped_) return;
+  mapped_ = true;
+  damage();
+}
+
+void Canvas::unmap() {
+  if (!mapped_) return;
+  damage();
+  mapped_ = false;
+  if (CanvasHost* h = host()) h->canvasRemoved(this);
+}
+
+bool Canvas::isMappedToRoot() const {
+  const Canvas* c = this;
+  for (; c; c = c->parent_) {
+    if (!c->mapped_) return false;
+    if (c->isRoot()) return true;
+  }
+  return false;
+}
+
+void Canvas::raise() {
+  if (!parent_) return;
+  auto& sib = parent_->children_;
+  auto it = std::find(sib.begin(), sib.end(), this);
+  if (it == sib.end() || it + 1 == sib.end()) return;
+  sib.erase(it);
+  sib.push_back(this);
+  parent_->childrenChanged();
+  damage();
+}
+
+void Canvas::lower() {
+  if (!parent_) return;
+  auto& sib = parent_->children_;
+  auto it = std::find(sib.begin(), sib.end(), this);
+  if (it == sib.end() || it == sib.begin()) return;
+  sib.erase(it);
+  sib.insert(sib.begin(), this);
+  parent_->childrenChanged();
+  damage();
+}
+
+size_t Canvas::stackIndex() const {
+  if (!parent_) return 0;
+  const auto& sib = parent_->children_;
+  return static_cast<size_t>(std::find(sib.begin(), sib.end(), this) - sib.begin());
+}
+
+void Canvas::reparent(Canvas* newParent) {
+  if (newParent == parent_) return;
+  for (Canvas* p = newParent; p; p = p->parent_) {
+    if (p == this) return;  // would make a cycle
+  }
+  forgetSubtree();
+  detachFromParent();
+  if (newParent) attachTo(newParent);
+}
+
+Canvas* Canvas::hit(XY<int> p) {
+  if (!mapped_ || !localBounds().contains(p)) return nullptr;
+  if (children_.size() >= kIndexThreshold) {
+    if (indexDirty_) {
+      index_.rebuild(children_, localBounds());
+      indexDirty_ = false;
+    }
+    const auto& cands = index_.candidatesAt(p);
+    for (auto it = cands.rbegin(); it != cands.rend(); ++it) {
+      Canvas* c = children_[*it];
+      if (Canvas* h = c->hit(p - XY<int>(c->rect_.x0, c->rect_.y0))) return h;
+    }
+    return this;
+  }
+  for (auto it = children_.rbegin(); it != children_.rend(); ++it) {
+    Canvas* c = *it;
+    if (Canvas* h = c->hit(p - XY<int>(c->rect_.x0, c->rect_.y0))) return h;
+  }
+  return this;
+}
+
+void Canvas::childrenIn(const Kw::Box<int>& area, std::vector<Canvas*>& out) const {
+  out.clear();
+  if (children_.size() >= kIndexThreshold) {
+    if (indexDirty_) {
+      index_.rebuild(children_, localBounds());
+      indexDirty_ = false;
+    }
+    std::vector<uint32_t> idx;
+    index_.candidatesIn(area, idx);
+    for (uint32_t i : idx) out.push_back(children_[i]);
+    return;
+  }
+  for (Canvas* c : children_) {
+    if (c->rect_.intersects(area)) out.push_back(c);
+  }
+}
+
+Canvas* Canvas::root() {
+  Canvas* c = this;
+  while (c->parent_) c = c->parent_;
+  return c->isRoot() ? c : nullptr;
+}
+
+CanvasHost* Canvas::host() const {
+  const Canvas* c = this;
+  while (c->parent_) c = c->parent_;
+  return c->host_;
+}
+
+PaintSession* Canvas::paintSession() const {
+  CanvasHost* h = host();
+  return h ? h->activePaintSession() : nullptr;
+}
+
+void Canvas::damage() { damage(localBounds()); }
+
+void Canvas::damage(const Kw::Box<int>& localArea) {
+  if (!isMappedToRoot()) return;
+  const XY<int> o = rootOrigin();
+  damageRoot(localArea.translated(o.x, o.y).intersection(visibleRootRect()));
+}
+
+void Canvas::damageRoot(const Kw::Box<int>& rootArea) const {
+  if (rootArea.empty()) return;
+  if (CanvasHost* h = host()) h->canvasDamaged(rootArea);
+}

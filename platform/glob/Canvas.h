@@ -1,0 +1,85 @@
+#pragma once
+// A drawing surface in the tree of canvases. Its position is its bottom-left corner in its
+// parent's coordinates, y upward. Children are kept in stacking order, the last on top, and
+// are clipped to their parent.
+#include <vector>
+
+#include "platform/glob/ChildIndex.h"
+#include "platform/kw/Box.h"
+
+class CanvasClient;
+class CanvasHost;
+class PaintSession;
+
+class Canvas {
+ public:
+  // A canvas inside `parent` (null for an unattached one).
+  Canvas(Canvas* parent, CanvasClient* client, const Kw::Box<int>& rectInParent);
+  // A root canvas of the given size, reporting to `host`.
+  Canvas(CanvasHost* host, CanvasClient* client, int width, int height);
+  ~Canvas();
+  Canvas(const Canvas&) = delete;
+  Canvas& operator=(const Canvas&) = delete;
+
+  Canvas* parent() const { return parent_; }
+  CanvasClient* client() const { return client_; }
+  const std::vector<Canvas*>& children() const { return children_; }
+
+  // Geometry.
+  const Kw::Box<int>& rect() const { return rect_; }  // in the parent
+  int width() const { return rect_.width(); }
+  int height() const { return rect_.height(); }
+  Kw::Box<int> localBounds() const { return Kw::Box<int>(0, 0, width(), height()); }
+  XY<int> rootOrigin() const;
+  Kw::Box<int> rootRect() const;
+  // The part of the canvas that can be seen: its root rectangle clipped by every ancestor.
+  Kw::Box<int> visibleRootRect() const;
+  void reshape(const Kw::Box<int>& rectInParent);
+  void translate(int dx, int dy);
+
+  // Mapping. A canvas shows only when it and all its ancestors are mapped up to a root.
+  void map();
+  void unmap();
+  bool isMapped() const { return mapped_; }
+  bool isMappedToRoot() const;
+
+  // Stacking among siblings.
+  void raise();
+  void lower();
+  size_t stackIndex() const;
+
+  // Moves this canvas (and its subtree) to another parent, keeping its position numbers.
+  void reparent(Canvas* newParent);
+
+  // The deepest mapped canvas at `p` (this canvas's coordinates), this one included; null when
+  // `p` is outside or the canvas is unmapped.
+  Canvas* hit(XY<int> p);
+  // Children (stacking order) whose rectangles meet `area` (this canvas's coordinates).
+  void childrenIn(const Kw::Box<int>& area, std::vector<Canvas*>& out) const;
+
+  // The root canvas above this one, or null when the canvas is unattached.
+  Canvas* root();
+  bool isRoot() const { return host_ != nullptr; }
+  CanvasHost* host() const;
+  PaintSession* paintSession() const;
+
+  // Reports the whole canvas, or a local area of it, as needing a repaint.
+  void damage();
+  void damage(const Kw::Box<int>& localArea);
+
+ private:
+  void attachTo(Canvas* parent);
+  void detachFromParent();
+  void childrenChanged();
+  void forgetSubtree();
+  void damageRoot(const Kw::Box<int>& rootArea) const;
+
+  Canvas* parent_ = nullptr;
+  CanvasClient* client_ = nullptr;
+  CanvasHost* host_ = nullptr;
+  Kw::Box<int> rect_;
+  bool mapped_ = true;
+  std::vector<Canvas*> children_;
+  mutable ChildIndex index_;
+  mutable bool indexDirty_ = true;
+};

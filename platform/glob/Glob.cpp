@@ -1,0 +1,298 @@
+#include "platform/glob/Glob.h"
+
+#include <cmath>
+#include <limits>
+#include <unordered_map>
+
+#include "platform/glob/RootGlob.h"
+#include "platform/glob/RuntimeClock.h"
+#include "platform/misc/Diagnostics.h"
+
+namespace {
+
+// Every live Glob with its serial: liveness checks on pointers that may dangle.
+std::unordered_map<const void*, uint64_t>& registry() {
+  static std::unordered_map<const void*, uint64_t> r;
+  return r;
+}
+
+uint64_t gNextSerial = 1;
+
+// Synchronous message nesting; deeper chains are refused rather than overflowing the stack.
+int gCallDepth = 0;
+constexpr int kMaxCallDepth = 64;
+
+}  // namespace
+
+bool is_good_glob_ptr(const void* p) { return p && registry().count(p) != 0; }
+
+bool glob_serial_is_alive(const Glob* g, uint64_t serial) {
+  auto it = registry().find(g);
+  return it != registry().end() && it->second == serial;
+}
+
+Glob::Glob(const GlobCreationInfo& info) { construct(info); }
+
+Glob::Glob(unsigned short width, unsigned short height, int flag, Canvas* parent) {
+  GlobCreationInfo info(width, height, parent);
+  info.flags = flag;
+  construct(info);
+}
+
+Glob::Glob(CanvasHost* host, int width, int height) {
+  serial_ = gNextSerial++;
+  registry()[this] = serial_;
+  canvas_ = std::make_unique<Canvas>(host, this, width, height);
+}
+
+void Glob::construct(const GlobCreationInfo& info) {
+  serial_ = gNextSerial++;
+  registry()[this] = serial_;
+  palette_ = info.palette;
+  canvas_ = std::make_unique<Canvas>(info.canvas, this,
+                                     Kw::Box<int>::fromSize(info.x, info.y, info.width, info.height));
+  if (info.flags & kGlobCreateUnmapped) canvas_->unmap();
+}
+
+Glob::~Glob() {
+  registry().erase(this);
+  // Children go first, youngest first; a child that is not a Glob is left unattached.
+  while (!canvas_->children().empty()) {
+    Canvas* c = canvas_->children().back();
+    if (Glob* g = globOf(c)) {
+      delete g;
+    } else {
+      c->reparent(nullptr);
+    }
+  }
+  canvas_.reset();
+}
+
+Glob* Glob::globOf(const Canvas* c) {
+  if (!c) return nullptr;
+  Glob* g = dynamic_cast<Glob*>(c->client());
+  return is_good_glob_ptr(g) ? g : nullptr;
+}
+
+Glob* Glob::parent() const {
+  for (Canvas* c = canvas_->parent(); c; c = c->parent()) {
+    if (Glob* g = globOf(c)) return g;
+  }
+  return nullptr;
+}
+
+unsigned short Glob::height() const { return static_cast<unsigned short>(canvas_->height()); }
+unsigned short Glob::width() const { return static_cast<unsigned short>(canvas_->width()); }
+
+int Glob::react(Event*) { return 0; }
+
+void Glob::set_interest(int mask) {
+  const bool newTicks = (mask & kInterestTicks) && !(interest_ & kInterestTicks);
+  interest_ |= mask;
+  if (newTicks) {
+    if (RootGlob* r = root()) r->addTicker(this);
+  }
+}
+
+void Glob::clear_interest(int mask) { interest_ &= ~mask; }
+
+void Glob::pop_to_top() { canvas_->raise(); }
+void Glob::push_to_bottom() { canvas_->lower(); }
+void Glob::map_canvas() { canvas_->map(); }
+void Glob::unmap_canvas() { canvas_->unmap(); }
+
+void Glob::reshape_canvas(int x, int y, int width, int height) {
+  const bool resized = width != canvas_->width() || height != canvas_->height();
+  canvas_->reshape(Kw::Box<int>::fromSize(x, y, std::max(0, width), std::max(0, height)));
+  if (resized) reshape();
+}
+
+void Glob::translate_canvas(int dx, int dy) { canvas_->translate(dx, dy); }
+
+int Glob::child_count() const { return static_cast<int>(children().size()); }
+
+void Glob::set_kbd_focus() {
+  if (RootGlob* r = root()) r->setFocus(this);
+}
+
+int Glob::call_msg(Glob* target, const char* msg) {
+  if (!is_good_glob_ptr(target)) {
+    diagWarning("call_msg to a deleted Glob dropped: " + String(msg ? msg : "") + "\n");
+    return -1;
+  }
+  if (gCallDepth >= kMaxCallDepth) {
+    diagError("call_msg nested too deeply, message dropped: " + String(msg ? msg : "") + "\n");
+    return -1;
+  }
+  Event e(kEventMessage);
+  e.message(msg ? msg : "");
+  e.setSender(this);
+  e.dest = target;
+  e.canvas = target->canvas();
+  ++gCallDepth;
+  const int result = target->react(&e);
+  --gCallDepth;
+  return result;
+}
+
+String Glob::get_id() const { return name_.empty() ? String(idstring()) : name_; }
+
+void Glob::setActive(bool active, bool redraw) {
+  if (active == active_) return;
+  active_ = active;
+  if (redraw) update();
+}
+
+void Glob::setVisible(bool visible) {
+  if (visible) {
+    canvas_->map();
+  } else {
+    canvas_->unmap();
+  }
+}
+
+void Glob::setPalette(const Palette& palette) {
+  if (palette == palette_) return;
+  palette_ = palette;
+  update();
+}
+
+void Glob::setCol(const Colour& colour, bool redraw) {
+  palette_.set(Palette::Window, colour);
+  if (redraw) update();
+}
+
+void Glob::detachFromParent() { canvas_->reparent(nullptr); }
+
+bool Glob::m_is_type(const char* type) const { return type && String(type) == idstring(); }
+
+String Glob::contextString(const XY<int>&, CanvasClient*) { return contextText_; }
+
+MouseCursorID Glob::contextCursor(const XY<int>&) { return defaultCursor_; }
+
+void Glob::update() { canvas_->damage(); }
+
+void Glob::update(const Kw::Box<int>& localArea) { canvas_->damage(localArea); }
+
+bool Glob::canDraw() {
+  return canvas_->isMappedToRoot() && !canvas_->visibleRootRect().empty();
+}
+
+double Glob::get_x() const { return canvas_->rootOrigin().x; }
+double Glob::get_y() const { return canvas_->rootOrigin().y; }
+
+std::vector<Glob*> Glob::children() const {
+  std::vector<Glob*> out;
+  for (Canvas* c : canvas_->children()) {
+    if (Glob* g = globOf(c)) out.push_back(g);
+  }
+  return out;
+}
+
+RootGlob* Glob::root() const { return dynamic_cast<RootGlob*>(canvas_->host()); }
+
+void Glob::send_msg(Glob* target, const char* msg) {
+  if (!is_good_glob_ptr(target)) {
+    diagWarning("send_msg to a deleted Glob dropped: " + String(msg ? msg : "") + "\n");
+    return;
+  }
+  RootGlob* r = target->root();
+  if (!r) r = RootGlob::current();
+  if (!r) {
+    diagWarning("send_msg with no screen to deliver it dropped: " + String(msg ? msg : "") + "\n");
+    return;
+  }
+  Event e(kEventMessage);
+  e.message(msg ? msg : "");
+  e.setSender(this);
+  e.dest = target;
+  e.canvas = target->canvas();
+  r->post(e);
+}
+
+int Glob::clock() { return static_cast<int>(RuntimeClock::now()); }
+
+// --- Free functions ---
+
+int event_send(Event* e, bool queued) {
+  if (!e) return 0;
+  Glob* dest = e->dest;
+  if (!dest && e->canvas) dest = dynamic_cast<Glob*>(e->canvas->client());
+  if (!is_good_glob_ptr(dest)) return 0;
+  e->dest = dest;
+  if (!e->canvas) e->canvas = dest->canvas();
+  RootGlob* r = dest->root();
+  if (queued) {
+    if (!r) r = RootGlob::current();
+    if (!r) return 0;
+    r->post(*e);
+    return 0;
+  }
+  if (message_event(e) || tick_event(e)) {
+    if (gCallDepth >= kMaxCallDepth) {
+      diagError("event_send nested too deeply, message dropped: " + e->text() + "\n");
+      return -1;
+    }
+    ++gCallDepth;
+    const int result = dest->react(e);
+    --gCallDepth;
+    return result;
+  }
+  if (r) return r->deliver(*e, dest, true);
+  return dest->react(e);
+}
+
+Glob* get_kbd_focus() {
+  RootGlob* r = RootGlob::current();
+  return r ? r->focus() : nullptr;
+}
+
+bool canvas_is_mapped_to_root(const Canvas* c) { return c && c->isMappedToRoot(); }
+
+Canvas* glib_getCurrentMouseCanvas() {
+  RootGlob* r = RootGlob::current();
+  Glob* g = r ? r->hovered() : nullptr;
+  return g ? g->canvas() : nullptr;
+}
+
+namespace {
+
+XY<double> centreOf(const Glob* g) {
+  const Kw::Box<int> b = g->canvas()->rootRect();
+  return XY<double>((b.x0 + b.x1) / 2.0, (b.y0 + b.y1) / 2.0);
+}
+
+}  // namespace
+
+Glob* find_nearest_glob(Glob* g, Glob* exclude) {
+  if (!is_good_glob_ptr(g)) return nullptr;
+  RootGlob* r = RootGlob::current();
+  if (!r) return nullptr;
+  const XY<double> c = centreOf(g);
+  Glob* found = r->globAt(XY<int>(static_cast<int>(c.x), static_cast<int>(c.y)));
+  // Climb out of g's own subtree and past the excluded Glob.
+  auto inSubtree = [g](Glob* x) {
+    for (Glob* p = x; p; p = p->parent()) {
+      if (p == g) return true;
+    }
+    return false;
+  };
+  while (found && (inSubtree(found) || found == exclude)) found = found->parent();
+  return found;
+}
+
+double glob_pseudo_distance(Glob* a, Glob* b) {
+  constexpr double kFar = std::numeric_limits<double>::max();
+  if (!is_good_glob_ptr(a) || !is_good_glob_ptr(b)) return kFar;
+  if (!b->canvas()->isMappedToRoot()) return kFar;
+  const XY<double> c = centreOf(a);
+  const Kw::Box<int> r = b->canvas()->visibleRootRect();
+  if (r.empty()) return kFar;
+  const double dx = std::max({r.x0 - c.x, 0.0, c.x - r.x1});
+  const double dy = std::max({r.y0 - c.y, 0.0, c.y - r.y1});
+  if (dx == 0.0 && dy == 0.0) {
+    const double edge = std::min({c.x - r.x0, r.x1 - c.x, c.y - r.y0, r.y1 - c.y});
+    return -std::max(edge, 1e-3);
+  }
+  return std::sqrt(dx * dx + dy * dy);
+}

@@ -1,0 +1,22 @@
+#pragma once
+// One repaint pass. The root walks the damaged canvases in stacking order and brackets each
+// client's draw() with beginCanvas/endCanvas; the drawing module's painter reaches the
+// session through the canvas it is asked to draw on.
+#include <vector>
+
+#include "platform/glob/Colour.h"
+#include "platform/kw/Box.h"
+
+class Canvas;
+
+class PaintSession {
+ public:
+  virtual ~PaintSession() = default;
+  // A pass over `areas` (root coordinates) starts: they are cleared to `background`.
+  virtual void beginFrame(const std::vector<Kw::Box<int>>& areas, const Colour& background) = 0;
+  // The pass is over: the areas may be presented.
+  virtual void endFrame(const std::vector<Kw::Box<int>>& areas) = 0;
+  // `clip` is the part of the root (root coordinates) that this canvas may touch now.
+  virtual void beginCanvas(Canvas& canvas, const Kw::Box<int>& clip) = 0;
+  virtual void endCanvas(Canvas& canvas) = 0;
+};

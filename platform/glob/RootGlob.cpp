@@ -1,0 +1,288 @@
+#include "platform/glob/RootGlob.h"
+
+#include <algorithm>
+
+#include "platform/glob/RuntimeClock.h"
+#include "platform/misc/Diagnostics.h"
+
+namespace {
+std::vector<RootGlob*>& liveRoots() {
+  static std::vector<RootGlob*> roots;
+  return roots;
+}
+}  // namespace
+
+RootGlob::RootGlob(int width, int height) : Glob(this, width, height) {
+  liveRoots().push_back(this);
+  nextTick_ = RuntimeClock::now() + tickPeriodMs_;
+  canvasDamaged(canvas()->rootRect());
+}
+
+RootGlob::~RootGlob() {
+  auto& roots = liveRoots();
+  roots.erase(std::remove(roots.begin(), roots.end(), this), roots.end());
+  // Children are deleted by the Glob destructor; nothing may be routed to them meanwhile.
+  queue_.clear();
+  tickers_.clear();
+}
+
+RootGlob* RootGlob::current() { return liveRoots().empty() ? nullptr : liveRoots().back(); }
+
+// --- Input ---
+
+bool RootGlob::isInside(const Canvas* c, const Canvas* ancestor) {
+  for (; c; c = c->parent()) {
+    if (c == ancestor) return true;
+  }
+  return false;
+}
+
+Glob* RootGlob::globAt(XY<int> pos) const {
+  for (Canvas* c = canvas()->hit(pos); c; c = c->parent()) {
+    if (Glob* g = globOf(c)) return g;
+  }
+  return nullptr;
+}
+
+void RootGlob::updateHover(Glob* under) {
+  if (hovered_.refersTo(under) && hovered_.alive()) return;
+  Glob* old = hovered_.get();
+  hovered_ = GlobHandle<>(under);
+  if (old) old->handleMouseContainment(false);
+  // The old Glob may have changed the tree; the new one must still be there and hovered.
+  if (under && hovered_.refersTo(under) && hovered_.alive()) under->handleMouseContainment(true);
+}
+
+int RootGlob::dragTypeFor(int moveType) const {
+  if (moveType != kEventMouseMove) return moveType;
+  if ((buttonsDown_ & 0x20) && (buttonsDown_ & 0x40)) return kEventChordMove;
+  if (buttonsDown_ & 0x20) return kEventLeftMove;
+  if (buttonsDown_ & 0x40) return kEventRightMove;
+  if (buttonsDown_ & 0x10) return kEventMiddleMove;
+  return kEventMouseMove;
+}
+
+void RootGlob::injectMouse(int type, XY<int> pos, int wheelSteps) {
+  Event probe(type);
+  if (!mouse_event(&probe)) {
+    diagWarning("injectMouse: not a mouse event code, ignored\n");
+    return;
+  }
+  pointer_ = pos;
+  Glob* under = globAt(pos);
+  updateHover(under);
+  under = hovered_.get();  // containment handlers may have deleted it
+
+  Event e(dragTypeFor(type));
+  e.screenPos = pos;
+  e.word2 = static_cast<uint32_t>(wheelSteps);
+  const int button = type & 0xF0;
+  Glob* target = nullptr;
+  if (mouse_down_event(&probe)) {
+    buttonsDown_ |= button == 0x80 ? 0x60 : button;
+    pressPos_ = pos;
+    target = grab_.get() ? grab_.get() : under;
+    if (!grab_.get()) grab_ = GlobHandle<>(under);
+  } else if (mouse_up_event(&probe)) {
+    buttonsDown_ &= ~(button == 0x80 ? 0x60 : button);
+    target = grab_.get() ? grab_.get() : under;
+    if (buttonsDown_ == 0) grab_.reset();
+  } else if (mouse_wheel_event(&probe)) {
+    target = under;
+  } else {
+    target = grab_.get() ? grab_.get() : under;
+  }
+  e.pressPos = pressPos_;
+  if (!target) return;
+  const XY<int> o = target->canvas()->rootOrigin();
+  e.pos = pos - o;
+  deliver(e, target, true);
+}
+
+void RootGlob::injectKey(int type, unsigned keyCode) {
+  Event e(type);
+  e.word2 = keyCode;
+  e.screenPos = pointer_;
+  Glob* target = focus_.get();
+  if (!target || !target->canvas()->isMappedToRoot()) target = this;
+  deliver(e, target, true);
+}
+
+int RootGlob::deliver(Event& e, Glob* target, bool bubble) {
+  GlobHandle<> h(target);
+  while (target) {
+    e.dest = target;
+    e.canvas = target->canvas();
+    const int result = target->react(&e);
+    if (result != 0 || !bubble) return result;
+    // The handler may have deleted its Glob; then the event stops here.
+    if (!h.alive()) return 0;
+    Glob* up = target->parent();
+    if (up && mouse_event(&e)) {
+      const Kw::Box<int>& r = target->canvas()->rect();
+      e.pos = e.pos + XY<int>(r.x0, r.y0);
+    }
+    target = up;
+    h = GlobHandle<>(target);
+  }
+  return 0;
+}
+
+// --- Queue ---
+
+void RootGlob::post(const Event& e) { queue_.push_back(e); }
+
+size_t RootGlob::pumpQueue(size_t limit) {
+  size_t n = 0;
+  while (!queue_.empty() && n < limit) {
+    Event e = std::move(queue_.front());
+    queue_.pop_front();
+    ++n;
+    // A destination deleted since the event was queued gets nothing.
+    if (!is_good_glob_ptr(e.dest)) continue;
+    event_send(&e, false);
+  }
+  if (!queue_.empty()) diagWarning("pumpQueue: delivery limit reached, the rest waits\n");
+  return n;
+}
+
+// --- Time ---
+
+void RootGlob::setTickPeriod(int ms) {
+  if (ms <= 0) {
+    diagWarning("setTickPeriod: period must be positive, kept " + std::to_string(tickPeriodMs_) +
+                "\n");
+    return;
+  }
+  tickPeriodMs_ = ms;
+  nextTick_ = RuntimeClock::now() + ms;
+}
+
+void RootGlob::addTicker(Glob* g) {
+  for (const auto& t : tickers_) {
+    if (t.refersTo(g) && t.alive()) return;
+  }
+  tickers_.emplace_back(g);
+}
+
+void RootGlob::runTicks() {
+  // Drop the dead and the uninterested first; handlers may subscribe others meanwhile.
+  tickers_.erase(std::remove_if(tickers_.begin(), tickers_.end(),
+                                [](const GlobHandle<>& h) {
+                                  Glob* g = h.get();
+                                  return !g || !(g->interest() & kInterestTicks);
+                                }),
+                 tickers_.end());
+  const std::vector<GlobHandle<>> now = tickers_;
+  for (const auto& h : now) {
+    Glob* g = h.get();
+    if (!g || !(g->interest() & kInterestTicks)) continue;
+    Event e(kEventTick);
+    e.screenPos = pointer_;
+    e.dest = g;
+    e.canvas = g->canvas();
+    g->react(&e);
+  }
+}
+
+void RootGlob::processTimers() {
+  const int64_t t = RuntimeClock::now();
+  if (t < nextTick_) return;
+  runTicks();
+  nextTick_ = std::max(nextTick_ + tickPeriodMs_, t + 1);
+}
+
+void RootGlob::advanceClock(int ms) {
+  if (ms < 0) {
+    diagWarning("advanceClock: time does not go backwards, ignored\n");
+    return;
+  }
+  const int64_t target = RuntimeClock::now() + ms;
+  while (nextTick_ <= target) {
+    RuntimeClock::setManualTime(nextTick_);
+    nextTick_ += tickPeriodMs_;
+    runTicks();
+    pumpQueue();
+  }
+  RuntimeClock::setManualTime(target);
+  pumpQueue();
+}
+
+// --- Focus ---
+
+void RootGlob::setFocus(Glob* g) {
+  if (g && g->root() != this) {
+    diagWarning("setFocus: the Glob is not on this screen, focus kept\n");
+    return;
+  }
+  if (focus_.refersTo(g) && focus_.alive()) return;
+  Glob* old = focus_.get();
+  focus_ = GlobHandle<>(g);
+  GlobHandle<> wanted(g);
+  if (old) old->handle_kbd_focus();
+  // The loser may have moved the focus elsewhere; then the newcomer is not told.
+  if (g && wanted.alive() && focus_.refersTo(g)) g->handle_kbd_focus();
+}
+
+MouseCursorID RootGlob::cursorAtPointer() {
+  Glob* g = hovered_.get();
+  if (!g) return kCursorArrow;
+  return g->contextCursor(pointer_ - g->canvas()->rootOrigin());
+}
+
+String RootGlob::contextStringAtPointer() {
+  for (Glob* g = hovered_.get(); g; g = g->parent()) {
+    String s = g->contextString(pointer_ - g->canvas()->rootOrigin(), nullptr);
+    if (!s.empty()) return s;
+  }
+  return String();
+}
+
+// --- CanvasHost ---
+
+void RootGlob::canvasDamaged(const Kw::Box<int>& rootArea) {
+  dirty_.add(rootArea.intersection(canvas()->rootRect()));
+}
+
+void RootGlob::canvasRemoved(Canvas* c) {
+  // A Glob being deleted is no longer registered: it gets no calls, its handle just clears.
+  if (Glob* g = grab_.get(); g && isInside(g->canvas(), c)) grab_.reset();
+  if (Glob* g = hovered_.get(); g && isInside(g->canvas(), c)) {
+    hovered_.reset();
+    g->handleMouseContainment(false);
+  }
+  if (Glob* g = focus_.get(); g && isInside(g->canvas(), c)) {
+    focus_.reset();
+    g->handle_kbd_focus();
+  }
+}
+
+// --- Painting ---
+
+bool RootGlob::paint(PaintSession& session) {
+  if (!Drawable::redrawsEnabled() || dirty_.empty()) return false;
+  const std::vector<Kw::Box<int>> areas = dirty_.take();
+  painting_ = &session;
+  session.beginFrame(areas, getPalette().get(Palette::Window));
+  for (const auto& area : areas) paintTree(session, canvas(), area);
+  session.endFrame(areas);
+  painting_ = nullptr;
+  return true;
+}
+
+void RootGlob::paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& clip) {
+  if (!c->isMapped()) return;
+  const Kw::Box<int> visible = c->rootRect().intersection(clip);
+  if (visible.empty()) return;
+  Glob* g = globOf(c);
+  if (g && g != this) {
+    s.beginCanvas(*c, visible);
+    g->draw();
+    s.endCanvas(*c);
+    if (drawObserver_) drawObserver_(g);
+  }
+  const XY<int> o = c->rootOrigin();
+  std::vector<Canvas*> kids;
+  c->childrenIn(visible.translated(-o.x, -o.y), kids);
+  for (Canvas* k : kids) paintTree(s, k, visible);
+}

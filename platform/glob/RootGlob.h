@@ -1,0 +1,104 @@
+#pragma once
+// The screen: the Glob at the top of the tree. It routes input (pointer with grab and
+// containment, keys to the focus), keeps the message queue, fires ticks from the runtime
+// clock, collects damage and runs repaint passes. Back ends and the test harness feed it.
+#include <deque>
+#include <functional>
+#include <vector>
+
+#include "platform/glob/CanvasHost.h"
+#include "platform/glob/DirtyRegion.h"
+#include "platform/glob/Glob.h"
+#include "platform/glob/GlobHandle.h"
+#include "platform/glob/PaintSession.h"
+
+class RootPaintSession;
+
+class RootGlob : public Glob, public CanvasHost {
+ public:
+  RootGlob(int width, int height);
+  ~RootGlob() override;
+
+  // The screen that free functions such as get_kbd_focus() refer to: the newest live root.
+  static RootGlob* current();
+
+  // --- Input, in root coordinates (bottom-left origin, y upward) ---
+  // `type` is a mouse event code. Moves become drags while a button is held.
+  void injectMouse(int type, XY<int> pos, int wheelSteps = 0);
+  // `type` is kEventKeyPress or kEventKeyRelease; `keyCode` carries its modifier bits.
+  void injectKey(int type, unsigned keyCode);
+
+  // --- Queued delivery ---
+  void post(const Event& e);
+  // Delivers queued events in order, including ones queued meanwhile, up to `limit`.
+  size_t pumpQueue(size_t limit = 100000);
+  size_t queuedCount() const { return queue_.size(); }
+
+  // --- Time ---
+  int tickPeriod() const { return tickPeriodMs_; }
+  void setTickPeriod(int ms);
+  // Delivers one tick to every Glob that asked for ticks.
+  void runTicks();
+  // Fires the ticks that are due by the runtime clock (for the real event loop).
+  void processTimers();
+  // Manual clock: moves time forward by `ms`, firing every tick on the way and pumping the
+  // queue after each.
+  void advanceClock(int ms);
+
+  // --- Focus and pointer ---
+  Glob* focus() const { return focus_.get(); }
+  // Gives `g` the keyboard focus (null clears it). The old holder, then the new, get
+  // handle_kbd_focus. Refused for a Glob of another screen.
+  void setFocus(Glob* g);
+  Glob* hovered() const { return hovered_.get(); }
+  Glob* grabbed() const { return grab_.get(); }
+  XY<int> pointer() const { return pointer_; }
+  // The cursor to show at the pointer, from the hovered Glob.
+  MouseCursorID cursorAtPointer();
+  // The help text at the pointer, from the hovered Glob.
+  String contextStringAtPointer();
+  // The deepest Glob at a root position.
+  Glob* globAt(XY<int> pos) const;
+
+  // --- Painting ---
+  bool needsPaint() const { return !dirty_.empty(); }
+  const DirtyRegion& dirty() const { return dirty_; }
+  // Repaints what is damaged; false when nothing was painted (nothing damaged, or redraws
+  // held back by disableRedraws/refresh_off).
+  bool paint(PaintSession& session);
+  // Called for each Glob asked to draw during paint().
+  void setDrawObserver(std::function<void(Glob*)> observer) { drawObserver_ = std::move(observer); }
+
+  // --- Delivery used by the free functions ---
+  // Delivers to `target`, bubbling unconsumed input to the parents. Returns the react result.
+  int deliver(Event& e, Glob* target, bool bubble);
+  void addTicker(Glob* g);
+
+  // --- CanvasHost ---
+  void canvasDamaged(const Kw::Box<int>& rootArea) override;
+  void canvasRemoved(Canvas* canvas) override;
+  PaintSession* activePaintSession() const override { return painting_; }
+
+  const char* idstring() const override { return "root"; }
+
+ private:
+  void updateHover(Glob* under);
+  int dragTypeFor(int moveType) const;
+  void paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& clip);
+  static bool isInside(const Canvas* c, const Canvas* ancestor);
+
+  std::deque<Event> queue_;
+  std::vector<GlobHandle<>> tickers_;
+  GlobHandle<> focus_;
+  GlobHandle<> hovered_;
+  GlobHandle<> grab_;
+  XY<int> pointer_;
+  XY<int> pressPos_;
+  int buttonsDown_ = 0;  // button bits of the mouse codes (0x10, 0x20, 0x40)
+  int tickPeriodMs_ = 10;
+  int64_t nextTick_ = 0;
+  DirtyRegion dirty_;
+  PaintSession* painting_ = nullptr;
+  std::function<void(Glob*)> drawObserver_;
+  RootGlob* previousRoot_ = nullptr;
+};

@@ -1,0 +1,6 @@
+#include "platform/os/OS.h"
+
+OSService* OS() {
+  static OSService service;
+  return &service;
+}

@@ -1,0 +1,55 @@
+#include <gtest/gtest.h>
+
+#include "platform/kw/Box.h"
+#include "platform/kw/NumRange.h"
+#include "platform/kw/Ptr.h"
+#include "platform/kw/String.h"
+
+TEST(KwString, RoundTripsAndReplacesInvalidUtf8) {
+  EXPECT_EQ(Kw::toWide("caf\xC3\xA9"), L"caf\u00E9");
+  EXPECT_EQ(Kw::toUtf8(L"caf\u00E9 \U0001F600"), "caf\xC3\xA9 \xF0\x9F\x98\x80");
+  // A lone continuation byte, a truncated sequence, an overlong '/', an encoded surrogate.
+  EXPECT_EQ(Kw::toWide("a\x80" "b"), L"a\uFFFDb");
+  EXPECT_EQ(Kw::toWide("x\xE2\x82"), L"x\uFFFD");
+  EXPECT_EQ(Kw::toWide("\xC0\xAF"), L"\uFFFD\uFFFD");
+  EXPECT_EQ(Kw::toWide("\xED\xA0\x80"), L"\uFFFD");
+  EXPECT_EQ(Kw::toWide("\xE2\x28\xA1"), L"\uFFFD(\uFFFD");
+  EXPECT_FALSE(Kw::isValidUtf8("\xFF"));
+  EXPECT_TRUE(Kw::isValidUtf8("plain \xE2\x82\xAC"));
+  EXPECT_EQ(Kw::toUtf8(WString(1, static_cast<wchar_t>(0xD800))), "\xEF\xBF\xBD");
+}
+
+namespace {
+struct Counted : Kw::RefCounted {
+  explicit Counted(int* deaths) : deaths_(deaths) {}
+  ~Counted() override { ++*deaths_; }
+  int* deaths_;
+};
+}  // namespace
+
+TEST(KwPtr, SharesAndReleasesOnce) {
+  int deaths = 0;
+  {
+    Kw::Ptr<Counted> a(new Counted(&deaths));
+    Kw::Ptr<Counted> b = a;
+    EXPECT_EQ(a->refCount(), 2);
+    Kw::Ptr<Counted> c = std::move(b);
+    EXPECT_FALSE(b);
+    a.reset();
+    EXPECT_EQ(deaths, 0);
+    c = c;  // self-assignment keeps the object
+    EXPECT_EQ(c->refCount(), 1);
+  }
+  EXPECT_EQ(deaths, 1);
+}
+
+TEST(KwBox, GeometryIsBottomUpAndHalfOpen) {
+  const Kw::Box<int> b = Kw::Box<int>::fromSize(10, 20, 30, 40);
+  EXPECT_TRUE(b.contains(XY<int>(10, 20)));
+  EXPECT_FALSE(b.contains(XY<int>(40, 20)));
+  EXPECT_TRUE(b.intersection(Kw::Box<int>(40, 0, 50, 100)).empty());
+  EXPECT_EQ(b.united(Kw::Box<int>()), b);
+  NumRange<double, true> r(5.0, -1.0);
+  EXPECT_EQ(r.min(), -1.0);
+  EXPECT_EQ(r.clamp(9.0), 5.0);
+}
