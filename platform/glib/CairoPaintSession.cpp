@@ -9,7 +9,9 @@ CairoPaintSession::CairoPaintSession(cairo_surface_t* surface)
       cr_(cairo_create(surface)),
       rootHeight_(cairo_image_surface_get_height(surface)) {}
 
-CairoPaintSession::~CairoPaintSession() { cairo_destroy(cr_); }
+CairoPaintSession::~CairoPaintSession() {
+  cairo_destroy(cr_);
+}
 
 void CairoPaintSession::beginFrame(const std::vector<Kw::Box<int>>& areas,
                                    const Colour& background) {
@@ -27,7 +29,9 @@ void CairoPaintSession::beginFrame(const std::vector<Kw::Box<int>>& areas,
   cairo_restore(cr_);
 }
 
-void CairoPaintSession::endFrame(const std::vector<Kw::Box<int>>&) { cairo_surface_flush(surface_); }
+void CairoPaintSession::endFrame(const std::vector<Kw::Box<int>>&) {
+  cairo_surface_flush(surface_);
+}
 
 void CairoPaintSession::beginCanvas(Canvas& canvas, const Kw::Box<int>& clip) {
   current_ = &canvas;

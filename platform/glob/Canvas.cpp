@@ -45,7 +45,9 @@ void Canvas::forgetSubtree() {
   if (CanvasHost* h = host()) h->canvasRemoved(this);
 }
 
-void Canvas::childrenChanged() { indexDirty_ = true; }
+void Canvas::childrenChanged() {
+  indexDirty_ = true;
+}
 
 XY<int> Canvas::rootOrigin() const {
   XY<int> o(rect_.x0, rect_.y0);
@@ -76,7 +78,9 @@ void Canvas::reshape(const Kw::Box<int>& rectInParent) {
   damage();
 }
 
-void Canvas::translate(int dx, int dy) { reshape(rect_.translated(dx, dy)); }
+void Canvas::translate(int dx, int dy) {
+  reshape(rect_.translated(dx, dy));
+}
 
 void Canvas::map() {
   if (mapped_) return;
@@ -193,7 +197,9 @@ PaintSession* Canvas::paintSession() const {
   return h ? h->activePaintSession() : nullptr;
 }
 
-void Canvas::damage() { damage(localBounds()); }
+void Canvas::damage() {
+  damage(localBounds());
+}
 
 void Canvas::damage(const Kw::Box<int>& localArea) {
   if (!isMappedToRoot()) return;

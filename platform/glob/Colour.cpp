@@ -4,7 +4,9 @@
 #include <cmath>
 
 namespace {
-double clamp01(double v) { return std::isnan(v) ? 0.0 : std::clamp(v, 0.0, 1.0); }
+double clamp01(double v) {
+  return std::isnan(v) ? 0.0 : std::clamp(v, 0.0, 1.0);
+}
 }  // namespace
 
 bool Colour::operator==(const Colour& o) const {

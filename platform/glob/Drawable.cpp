@@ -7,7 +7,9 @@ int gRedrawsDisabled = 0;
 int gRefreshOff = 0;
 }  // namespace
 
-void Drawable::disableRedraws() { ++gRedrawsDisabled; }
+void Drawable::disableRedraws() {
+  ++gRedrawsDisabled;
+}
 
 void Drawable::enableRedraws() {
   if (gRedrawsDisabled == 0) {
@@ -17,9 +19,13 @@ void Drawable::enableRedraws() {
   --gRedrawsDisabled;
 }
 
-bool Drawable::redrawsEnabled() { return gRedrawsDisabled == 0 && gRefreshOff == 0; }
+bool Drawable::redrawsEnabled() {
+  return gRedrawsDisabled == 0 && gRefreshOff == 0;
+}
 
-void refresh_off() { ++gRefreshOff; }
+void refresh_off() {
+  ++gRefreshOff;
+}
 
 void refresh_on() {
   if (gRefreshOff == 0) {
@@ -29,4 +35,6 @@ void refresh_on() {
   --gRefreshOff;
 }
 
-bool refresh_is_on() { return gRefreshOff == 0; }
+bool refresh_is_on() {
+  return gRefreshOff == 0;
+}

@@ -51,9 +51,9 @@ class Event {
   // Second word: the key code of a key event, the modifier word of a message event, the
   // signed step count of a wheel event.
   uint32_t word2 = 0;
-  XY<int> pos;          // in the receiving canvas, bottom-left origin
-  XY<int> screenPos;    // in the root
-  XY<int> pressPos;     // root position of the press that started a drag
+  XY<int> pos;        // in the receiving canvas, bottom-left origin
+  XY<int> screenPos;  // in the root
+  XY<int> pressPos;   // root position of the press that started a drag
   Canvas* canvas = nullptr;
   Glob* dest = nullptr;
 

@@ -24,14 +24,18 @@ constexpr int kMaxCallDepth = 64;
 
 }  // namespace
 
-bool is_good_glob_ptr(const void* p) { return p && registry().count(p) != 0; }
+bool is_good_glob_ptr(const void* p) {
+  return p && registry().count(p) != 0;
+}
 
 bool glob_serial_is_alive(const Glob* g, uint64_t serial) {
   auto it = registry().find(g);
   return it != registry().end() && it->second == serial;
 }
 
-Glob::Glob(const GlobCreationInfo& info) { construct(info); }
+Glob::Glob(const GlobCreationInfo& info) {
+  construct(info);
+}
 
 Glob::Glob(unsigned short width, unsigned short height, int flag, Canvas* parent) {
   GlobCreationInfo info(width, height, parent);
@@ -49,14 +53,18 @@ void Glob::construct(const GlobCreationInfo& info) {
   serial_ = gNextSerial++;
   registry()[this] = serial_;
   palette_ = info.palette;
-  canvas_ = std::make_unique<Canvas>(info.canvas, this,
-                                     Kw::Box<int>::fromSize(info.x, info.y, info.width, info.height));
+  canvas_ = std::make_unique<Canvas>(
+      info.canvas, this, Kw::Box<int>::fromSize(info.x, info.y, info.width, info.height));
   if (info.flags & kGlobCreateUnmapped) canvas_->unmap();
 }
 
 Glob::~Glob() {
   registry().erase(this);
-  // Children go first, youngest first; a child that is not a Glob is left unattached.
+  deleteChildren();
+  canvas_.reset();
+}
+
+void Glob::deleteChildren() {
   while (!canvas_->children().empty()) {
     Canvas* c = canvas_->children().back();
     if (Glob* g = globOf(c)) {
@@ -65,7 +73,6 @@ Glob::~Glob() {
       c->reparent(nullptr);
     }
   }
-  canvas_.reset();
 }
 
 Glob* Glob::globOf(const Canvas* c) {
@@ -81,10 +88,16 @@ Glob* Glob::parent() const {
   return nullptr;
 }
 
-unsigned short Glob::height() const { return static_cast<unsigned short>(canvas_->height()); }
-unsigned short Glob::width() const { return static_cast<unsigned short>(canvas_->width()); }
+unsigned short Glob::height() const {
+  return static_cast<unsigned short>(canvas_->height());
+}
+unsigned short Glob::width() const {
+  return static_cast<unsigned short>(canvas_->width());
+}
 
-int Glob::react(Event*) { return 0; }
+int Glob::react(Event*) {
+  return 0;
+}
 
 void Glob::set_interest(int mask) {
   const bool newTicks = (mask & kInterestTicks) && !(interest_ & kInterestTicks);
@@ -94,12 +107,22 @@ void Glob::set_interest(int mask) {
   }
 }
 
-void Glob::clear_interest(int mask) { interest_ &= ~mask; }
+void Glob::clear_interest(int mask) {
+  interest_ &= ~mask;
+}
 
-void Glob::pop_to_top() { canvas_->raise(); }
-void Glob::push_to_bottom() { canvas_->lower(); }
-void Glob::map_canvas() { canvas_->map(); }
-void Glob::unmap_canvas() { canvas_->unmap(); }
+void Glob::pop_to_top() {
+  canvas_->raise();
+}
+void Glob::push_to_bottom() {
+  canvas_->lower();
+}
+void Glob::map_canvas() {
+  canvas_->map();
+}
+void Glob::unmap_canvas() {
+  canvas_->unmap();
+}
 
 void Glob::reshape_canvas(int x, int y, int width, int height) {
   const bool resized = width != canvas_->width() || height != canvas_->height();
@@ -107,9 +130,13 @@ void Glob::reshape_canvas(int x, int y, int width, int height) {
   if (resized) reshape();
 }
 
-void Glob::translate_canvas(int dx, int dy) { canvas_->translate(dx, dy); }
+void Glob::translate_canvas(int dx, int dy) {
+  canvas_->translate(dx, dy);
+}
 
-int Glob::child_count() const { return static_cast<int>(children().size()); }
+int Glob::child_count() const {
+  return static_cast<int>(children().size());
+}
 
 void Glob::set_kbd_focus() {
   if (RootGlob* r = root()) r->setFocus(this);
@@ -135,7 +162,9 @@ int Glob::call_msg(Glob* target, const char* msg) {
   return result;
 }
 
-String Glob::get_id() const { return name_.empty() ? String(idstring()) : name_; }
+String Glob::get_id() const {
+  return name_.empty() ? String(idstring()) : name_;
+}
 
 void Glob::setActive(bool active, bool redraw) {
   if (active == active_) return;
@@ -162,24 +191,40 @@ void Glob::setCol(const Colour& colour, bool redraw) {
   if (redraw) update();
 }
 
-void Glob::detachFromParent() { canvas_->reparent(nullptr); }
+void Glob::detachFromParent() {
+  canvas_->reparent(nullptr);
+}
 
-bool Glob::m_is_type(const char* type) const { return type && String(type) == idstring(); }
+bool Glob::m_is_type(const char* type) const {
+  return type && String(type) == idstring();
+}
 
-String Glob::contextString(const XY<int>&, CanvasClient*) { return contextText_; }
+String Glob::contextString(const XY<int>&, CanvasClient*) {
+  return contextText_;
+}
 
-MouseCursorID Glob::contextCursor(const XY<int>&) { return defaultCursor_; }
+MouseCursorID Glob::contextCursor(const XY<int>&) {
+  return defaultCursor_;
+}
 
-void Glob::update() { canvas_->damage(); }
+void Glob::update() {
+  canvas_->damage();
+}
 
-void Glob::update(const Kw::Box<int>& localArea) { canvas_->damage(localArea); }
+void Glob::update(const Kw::Box<int>& localArea) {
+  canvas_->damage(localArea);
+}
 
 bool Glob::canDraw() {
   return canvas_->isMappedToRoot() && !canvas_->visibleRootRect().empty();
 }
 
-double Glob::get_x() const { return canvas_->rootOrigin().x; }
-double Glob::get_y() const { return canvas_->rootOrigin().y; }
+double Glob::get_x() const {
+  return canvas_->rootOrigin().x;
+}
+double Glob::get_y() const {
+  return canvas_->rootOrigin().y;
+}
 
 std::vector<Glob*> Glob::children() const {
   std::vector<Glob*> out;
@@ -189,7 +234,9 @@ std::vector<Glob*> Glob::children() const {
   return out;
 }
 
-RootGlob* Glob::root() const { return dynamic_cast<RootGlob*>(canvas_->host()); }
+RootGlob* Glob::root() const {
+  return dynamic_cast<RootGlob*>(canvas_->host());
+}
 
 void Glob::send_msg(Glob* target, const char* msg) {
   if (!is_good_glob_ptr(target)) {
@@ -210,7 +257,9 @@ void Glob::send_msg(Glob* target, const char* msg) {
   r->post(e);
 }
 
-int Glob::clock() { return static_cast<int>(RuntimeClock::now()); }
+int Glob::clock() {
+  return static_cast<int>(RuntimeClock::now());
+}
 
 // --- Free functions ---
 
@@ -247,7 +296,9 @@ Glob* get_kbd_focus() {
   return r ? r->focus() : nullptr;
 }
 
-bool canvas_is_mapped_to_root(const Canvas* c) { return c && c->isMappedToRoot(); }
+bool canvas_is_mapped_to_root(const Canvas* c) {
+  return c && c->isMappedToRoot();
+}
 
 Canvas* glib_getCurrentMouseCanvas() {
   RootGlob* r = RootGlob::current();

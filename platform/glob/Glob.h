@@ -109,6 +109,9 @@ class Glob : public CanvasClient, public Drawable {
   // The screen's own Glob: its canvas is a root canvas reporting to `host`.
   Glob(CanvasHost* host, int width, int height);
 
+  // Deletes every child Glob, youngest first; children that are not Globs are left unattached.
+  void deleteChildren();
+
   // The Glob owning a canvas, or null when the canvas belongs to something else.
   static Glob* globOf(const Canvas* c);
 

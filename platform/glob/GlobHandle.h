@@ -20,7 +20,9 @@ class GlobHandle {
     serial_ = 0;
   }
   // Compares identities, alive or not.
-  bool refersTo(const T* g) const { return g && p_ == g && serial_ == static_cast<const Glob*>(g)->serial(); }
+  bool refersTo(const T* g) const {
+    return g && p_ == g && serial_ == static_cast<const Glob*>(g)->serial();
+  }
 
  private:
   T* p_ = nullptr;

@@ -7,9 +7,9 @@ enum MouseCursorID : int {
   kCursorResizeVertical = 4,    // up-down resize handle
   kCursorText = 8,              // I-beam over editable text
   kCursorWait = 12,
-  kCursorArrow = 16,         // the ordinary pointer
-  kCursorHand = 20,          // something that reacts to a click
-  kCursorValueDrag = 21,     // dragging changes a value
+  kCursorArrow = 16,      // the ordinary pointer
+  kCursorHand = 20,       // something that reacts to a click
+  kCursorValueDrag = 21,  // dragging changes a value
   kCursorHorizontalMove = 22,
   kCursorVerticalMove = 23,
 };

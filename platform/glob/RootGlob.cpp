@@ -21,12 +21,16 @@ RootGlob::RootGlob(int width, int height) : Glob(this, width, height) {
 RootGlob::~RootGlob() {
   auto& roots = liveRoots();
   roots.erase(std::remove(roots.begin(), roots.end(), this), roots.end());
-  // Children are deleted by the Glob destructor; nothing may be routed to them meanwhile.
+  // The children go while the screen's own state still exists: their canvases report damage
+  // and removal to it on the way out.
+  deleteChildren();
   queue_.clear();
   tickers_.clear();
 }
 
-RootGlob* RootGlob::current() { return liveRoots().empty() ? nullptr : liveRoots().back(); }
+RootGlob* RootGlob::current() {
+  return liveRoots().empty() ? nullptr : liveRoots().back();
+}
 
 // --- Input ---
 
@@ -130,7 +134,9 @@ int RootGlob::deliver(Event& e, Glob* target, bool bubble) {
 
 // --- Queue ---
 
-void RootGlob::post(const Event& e) { queue_.push_back(e); }
+void RootGlob::post(const Event& e) {
+  queue_.push_back(e);
+}
 
 size_t RootGlob::pumpQueue(size_t limit) {
   size_t n = 0;
@@ -217,11 +223,16 @@ void RootGlob::setFocus(Glob* g) {
   }
   if (focus_.refersTo(g) && focus_.alive()) return;
   Glob* old = focus_.get();
+  // A Glob that was given the focus but not yet told (its predecessor is still handling the
+  // loss and moved the focus on) hears nothing at all.
+  const bool oldWasTold = !unannouncedFocus_.refersTo(old);
   focus_ = GlobHandle<>(g);
-  GlobHandle<> wanted(g);
-  if (old) old->handle_kbd_focus();
-  // The loser may have moved the focus elsewhere; then the newcomer is not told.
-  if (g && wanted.alive() && focus_.refersTo(g)) g->handle_kbd_focus();
+  unannouncedFocus_ = GlobHandle<>(g);
+  if (old && oldWasTold) old->handle_kbd_focus();
+  if (g && focus_.refersTo(g) && focus_.alive()) {
+    unannouncedFocus_.reset();
+    g->handle_kbd_focus();
+  }
 }
 
 MouseCursorID RootGlob::cursorAtPointer() {

@@ -90,6 +90,7 @@ class RootGlob : public Glob, public CanvasHost {
   std::deque<Event> queue_;
   std::vector<GlobHandle<>> tickers_;
   GlobHandle<> focus_;
+  GlobHandle<> unannouncedFocus_;
   GlobHandle<> hovered_;
   GlobHandle<> grab_;
   XY<int> pointer_;

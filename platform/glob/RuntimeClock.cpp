@@ -20,7 +20,9 @@ void RuntimeClock::setManual(bool manual, int64_t startMs) {
   gManualNow = startMs;
 }
 
-bool RuntimeClock::isManual() { return gManual; }
+bool RuntimeClock::isManual() {
+  return gManual;
+}
 
 void RuntimeClock::setManualTime(int64_t ms) {
   if (ms > gManualNow) gManualNow = ms;

@@ -7,7 +7,8 @@ template <typename T, bool Unordered = false>
 class NumRange {
  public:
   constexpr NumRange() = default;
-  constexpr NumRange(T a, T b) : min_(Unordered ? std::min(a, b) : a), max_(Unordered ? std::max(a, b) : b) {}
+  constexpr NumRange(T a, T b)
+      : min_(Unordered ? std::min(a, b) : a), max_(Unordered ? std::max(a, b) : b) {}
 
   constexpr T min() const { return min_; }
   constexpr T max() const { return max_; }

@@ -9,7 +9,11 @@ struct XY {
   constexpr XY() = default;
   constexpr XY(T xv, T yv) : x(xv), y(yv) {}
 
-  constexpr XY operator+(const XY& o) const { return {static_cast<T>(x + o.x), static_cast<T>(y + o.y)}; }
-  constexpr XY operator-(const XY& o) const { return {static_cast<T>(x - o.x), static_cast<T>(y - o.y)}; }
+  constexpr XY operator+(const XY& o) const {
+    return {static_cast<T>(x + o.x), static_cast<T>(y + o.y)};
+  }
+  constexpr XY operator-(const XY& o) const {
+    return {static_cast<T>(x - o.x), static_cast<T>(y - o.y)};
+  }
   constexpr bool operator==(const XY& o) const = default;
 };

@@ -16,10 +16,14 @@ State& state() {
 
 const char* levelName(DiagLevel level) {
   switch (level) {
-    case DiagLevel::Debug: return "debug";
-    case DiagLevel::Info: return "info";
-    case DiagLevel::Warning: return "warning";
-    case DiagLevel::Error: return "error";
+    case DiagLevel::Debug:
+      return "debug";
+    case DiagLevel::Info:
+      return "info";
+    case DiagLevel::Warning:
+      return "warning";
+    case DiagLevel::Error:
+      return "error";
   }
   return "?";
 }
@@ -37,8 +41,12 @@ void Diagnostics::print(DiagLevel level, const String& text) {
   if (text.empty() || text.back() != '\n') std::fputc('\n', stderr);
 }
 
-void Diagnostics::setThreshold(DiagLevel level) { state().threshold = level; }
-DiagLevel Diagnostics::threshold() { return state().threshold; }
+void Diagnostics::setThreshold(DiagLevel level) {
+  state().threshold = level;
+}
+DiagLevel Diagnostics::threshold() {
+  return state().threshold;
+}
 
 Diagnostics::Sink Diagnostics::setSink(Sink sink) {
   Sink old = std::move(state().sink);

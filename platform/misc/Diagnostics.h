@@ -41,5 +41,9 @@ class Diagnostics {
 };
 
 // Shorthands for the common levels.
-inline void diagWarning(const String& text) { Diagnostics::print(DiagLevel::Warning, text); }
-inline void diagError(const String& text) { Diagnostics::print(DiagLevel::Error, text); }
+inline void diagWarning(const String& text) {
+  Diagnostics::print(DiagLevel::Warning, text);
+}
+inline void diagError(const String& text) {
+  Diagnostics::print(DiagLevel::Error, text);
+}

@@ -36,7 +36,9 @@ GlobCreationInfo Harness::place(int x, int y, int width, int height) const {
                           root_->canvas(), x, y);
 }
 
-void Harness::move(XY<int> p) { root_->injectMouse(kEventMouseMove, p); }
+void Harness::move(XY<int> p) {
+  root_->injectMouse(kEventMouseMove, p);
+}
 
 void Harness::press(XY<int> p, MouseButton b) {
   root_->injectMouse(0x102 | static_cast<int>(b), p);
@@ -62,7 +64,9 @@ void Harness::drag(XY<int> from, XY<int> to, int steps, MouseButton b) {
   release(to, b);
 }
 
-void Harness::wheel(XY<int> p, int steps) { root_->injectMouse(kEventMouseWheel, p, steps); }
+void Harness::wheel(XY<int> p, int steps) {
+  root_->injectMouse(kEventMouseWheel, p, steps);
+}
 
 XY<int> Harness::centreOf(const Glob& g) {
   const Kw::Box<int> r = g.canvas()->visibleRootRect();
@@ -74,21 +78,29 @@ void Harness::setModifiers(unsigned mods) {
   OS()->keyboard().setModifiers(modifiers_);
 }
 
-unsigned Harness::withModifiers(unsigned code) const { return code | modifiers_; }
+unsigned Harness::withModifiers(unsigned code) const {
+  return code | modifiers_;
+}
 
 void Harness::key(unsigned code) {
   keyPress(code);
   keyRelease(code);
 }
 
-void Harness::keyPress(unsigned code) { root_->injectKey(kEventKeyPress, withModifiers(code)); }
-void Harness::keyRelease(unsigned code) { root_->injectKey(kEventKeyRelease, withModifiers(code)); }
+void Harness::keyPress(unsigned code) {
+  root_->injectKey(kEventKeyPress, withModifiers(code));
+}
+void Harness::keyRelease(unsigned code) {
+  root_->injectKey(kEventKeyRelease, withModifiers(code));
+}
 
 void Harness::type(const WString& text) {
   for (wchar_t c : text) key(static_cast<unsigned>(c));
 }
 
-int64_t Harness::now() { return RuntimeClock::now(); }
+int64_t Harness::now() {
+  return RuntimeClock::now();
+}
 
 std::vector<Glob*> Harness::paint() {
   drawn_.clear();

@@ -9,7 +9,9 @@ TEST(KwString, RoundTripsAndReplacesInvalidUtf8) {
   EXPECT_EQ(Kw::toWide("caf\xC3\xA9"), L"caf\u00E9");
   EXPECT_EQ(Kw::toUtf8(L"caf\u00E9 \U0001F600"), "caf\xC3\xA9 \xF0\x9F\x98\x80");
   // A lone continuation byte, a truncated sequence, an overlong '/', an encoded surrogate.
-  EXPECT_EQ(Kw::toWide("a\x80" "b"), L"a\uFFFDb");
+  EXPECT_EQ(Kw::toWide("a\x80"
+                       "b"),
+            L"a\uFFFDb");
   EXPECT_EQ(Kw::toWide("x\xE2\x82"), L"x\uFFFD");
   EXPECT_EQ(Kw::toWide("\xC0\xAF"), L"\uFFFD\uFFFD");
   EXPECT_EQ(Kw::toWide("\xED\xA0\x80"), L"\uFFFD");
