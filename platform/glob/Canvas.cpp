@@ -21,7 +21,8 @@ Canvas::~Canvas() {
   // Children still attached belong to someone else; they become unattached.
   for (Canvas* c : children_) c->parent_ = nullptr;
   children_.clear();
-  forgetSubtree();
+  // A root canvas outlives nothing it could report to: its host is being destroyed.
+  if (!isRoot()) forgetSubtree();
   detachFromParent();
 }
 
