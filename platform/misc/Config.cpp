@@ -1,19 +1,15 @@
 #include "platform/misc/Config.h"
 
-#include <charconv>
-#include <cmath>
 #include <cstdlib>
-#include <set>
 
 #include "platform/misc/Diagnostics.h"
+#include "platform/misc/NumberText.h"
 
 namespace {
 
 struct ProcessConfig {
   configb record;
   bool initialised = false;
-  // "key\0value" pairs already reported, so that a setting read often does not flood the log.
-  std::set<String> reported;
 };
 
 ProcessConfig& state() {
@@ -21,9 +17,9 @@ ProcessConfig& state() {
   return s;
 }
 
-void reportOnce(const char* key, const String& value, const char* problem, const String& def) {
-  String id = String(key) + '\0' + value;
-  if (!state().reported.insert(std::move(id)).second) return;
+void reportOnce(const configb& record, const char* key, const String& value, const char* problem,
+                const String& def) {
+  if (!record.firstReportOf(key, value)) return;
   diagWarning(String("config: ") + key + " = '" + value + "' " + problem + "; using " + def);
 }
 
@@ -34,30 +30,6 @@ const String* lookUp(const configb& record, const char* key) {
     return nullptr;
   }
   return record.find(key);
-}
-
-// The value without surrounding blanks and with one leading '+' dropped: from_chars accepts a
-// '-' sign only.
-std::string_view numberText(const String& value) {
-  std::string_view s = value;
-  const auto blank = [](char c) { return c == ' ' || c == '\t'; };
-  while (!s.empty() && blank(s.front())) s.remove_prefix(1);
-  while (!s.empty() && blank(s.back())) s.remove_suffix(1);
-  if (s.size() > 1 && s.front() == '+' && s[1] != '-' && s[1] != '+') s.remove_prefix(1);
-  return s;
-}
-
-template <typename T>
-bool parseWhole(std::string_view s, T& out, std::errc& ec) {
-  const auto [end, err] = std::from_chars(s.data(), s.data() + s.size(), out);
-  ec = err;
-  return err == std::errc() && end == s.data() + s.size() && !s.empty();
-}
-
-String formatDouble(double v) {
-  char buf[32];
-  const auto [end, ec] = std::to_chars(buf, buf + sizeof buf, v);
-  return ec == std::errc() ? String(buf, end) : String("?");
 }
 
 }  // namespace
@@ -84,29 +56,23 @@ bool setConfigFile(const String& path) {
 int config_int(const configb& record, const char* key, int def) {
   const String* value = lookUp(record, key);
   if (value == nullptr) return def;
-  int out = 0;
-  std::errc ec{};
-  if (parseWhole(numberText(*value), out, ec)) return out;
-  const char* problem =
-      ec == std::errc::result_out_of_range ? "is out of range" : "is not an integer";
-  reportOnce(key, *value, problem, std::to_string(def));
-  return def;
+  int out = def;
+  const NumberText::Result r = NumberText::parse(*value, out);
+  if (r != NumberText::Result::Ok) {
+    reportOnce(record, key, *value, NumberText::describe(r), std::to_string(def));
+  }
+  return out;
 }
 
 double config_double(const configb& record, const char* key, double def) {
   const String* value = lookUp(record, key);
   if (value == nullptr) return def;
-  double out = 0;
-  std::errc ec{};
-  if (parseWhole(numberText(*value), out, ec)) {
-    if (std::isfinite(out)) return out;
-    reportOnce(key, *value, "is not finite", formatDouble(def));
-    return def;
+  double out = def;
+  const NumberText::Result r = NumberText::parse(*value, out);
+  if (r != NumberText::Result::Ok) {
+    reportOnce(record, key, *value, NumberText::describe(r), NumberText::format(def));
   }
-  const char* problem =
-      ec == std::errc::result_out_of_range ? "is out of range" : "is not a number";
-  reportOnce(key, *value, problem, formatDouble(def));
-  return def;
+  return out;
 }
 
 int config_int(const char* key, int def) {

@@ -8,7 +8,7 @@
 // Reading a value: a missing key gives the default, silently. A value that does not parse as a
 // whole (decimal integers with an optional sign; for doubles, the usual decimal and exponent
 // forms), that is out of range for the type, or that is NaN or infinite gives the default and
-// a diagnostic, once per key and bad value.
+// a diagnostic, once per record, key and bad value.
 #include "platform/misc/configb.h"
 
 // The process's configuration record.

@@ -32,7 +32,7 @@ bool configb::loadFile(const String& path) {
 }
 
 void configb::loadText(std::string_view text, const String& origin) {
-  entries_.clear();
+  clear();
   int lineNo = 0;
   while (!text.empty()) {
     const std::size_t end = text.find('\n');
@@ -58,4 +58,8 @@ const String* configb::find(const String& key) const {
 String configb::get(const String& key, const String& def) const {
   const String* v = find(key);
   return v != nullptr ? *v : def;
+}
+
+bool configb::firstReportOf(const String& key, const String& value) const {
+  return reported_.insert(key + '\0' + value).second;
 }

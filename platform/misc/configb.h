@@ -8,6 +8,7 @@
 // line wins, so that a file can override itself.
 #include <cstddef>
 #include <map>
+#include <set>
 #include <string_view>
 
 #include "platform/kw/String.h"
@@ -28,10 +29,18 @@ class configb {
   const String* find(const String& key) const;
   String get(const String& key, const String& def = String()) const;
   bool remove(const String& key) { return entries_.erase(key) != 0; }
-  void clear() { entries_.clear(); }
+  void clear() {
+    entries_.clear();
+    reported_.clear();
+  }
   std::size_t size() const { return entries_.size(); }
   const std::map<String, String>& entries() const { return entries_; }
 
+  // True the first time it is asked about this key and value: readers that find a bad value
+  // report it once, not at every read.
+  bool firstReportOf(const String& key, const String& value) const;
+
  private:
   std::map<String, String> entries_;
+  mutable std::set<String> reported_;
 };
