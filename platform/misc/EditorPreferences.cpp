@@ -10,12 +10,15 @@ namespace {
 
 const String kWho = "EditorPreferences: ";
 
+// The first few line numbers; a badly damaged file must not make a huge diagnostic.
 String lineList(const std::vector<int>& lines) {
+  constexpr std::size_t kShown = 10;
   String out;
-  for (std::size_t i = 0; i < lines.size(); ++i) {
+  for (std::size_t i = 0; i < lines.size() && i < kShown; ++i) {
     if (i != 0) out += ", ";
     out += std::to_string(lines[i]);
   }
+  if (lines.size() > kShown) out += " and " + std::to_string(lines.size() - kShown) + " more";
   return out;
 }
 
@@ -57,6 +60,17 @@ bool EditorPreferences::loadFromFile() const {
       break;
   }
   const PreferenceCodec::ParseResult result = PreferenceCodec::parse(text, values_);
+  // What setPreference would refuse is not taken from the file either.
+  std::size_t oversized = 0;
+  for (auto it = values_.begin(); it != values_.end();) {
+    const bool tooBig = it->first.size() > kMaxKeyBytes || it->second.size() > kMaxValueBytes;
+    oversized += tooBig ? 1 : 0;
+    it = tooBig ? values_.erase(it) : std::next(it);
+  }
+  if (oversized != 0) {
+    diagWarning(kWho + path_ + ": skipped " + std::to_string(oversized) + " oversized entr" +
+                (oversized == 1 ? "y" : "ies"));
+  }
   if (!result.corruptLines.empty()) {
     diagWarning(kWho + path_ + ": skipped corrupt line(s) " + lineList(result.corruptLines));
   }

@@ -116,7 +116,7 @@ bool FileText::writeAtomically(const String& path, std::string_view bytes, Strin
   }
 
   String tmpName = path + ".tmp-XXXXXX";
-  FdGuard fd(::mkstemp(tmpName.data()));
+  FdGuard fd(::mkostemp(tmpName.data(), O_CLOEXEC));
   if (fd.get() < 0) {
     error = describe("cannot create temporary file for", path, errno);
     return false;

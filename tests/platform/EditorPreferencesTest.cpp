@@ -200,6 +200,13 @@ TEST(EditorPreferences, OversizedKeysAndValuesAreRefusedKeepingThePreviousValue)
   EXPECT_FALSE(p.setPreference(String(EditorPreferences::kMaxKeyBytes + 1, 'k'), "x"));
   EXPECT_TRUE(p.setPreference(String(EditorPreferences::kMaxKeyBytes, 'k'), "x"));
   EXPECT_EQ(EditorPreferences(path).getPreference("v"), largest);
+
+  // An oversized entry written into the file by hand is skipped on reading.
+  TempDir::write(path, "v=" + String(EditorPreferences::kMaxValueBytes + 1, 'a') + "\nsmall=1\n");
+  diag.clear();
+  EditorPreferences reread(path);
+  EXPECT_EQ(reread.allPreferences(), (std::map<String, String>{{"small", "1"}}));
+  EXPECT_TRUE(diag.contains("skipped 1 oversized entry"));
 }
 
 TEST(EditorPreferences, SavingKeepsTheFilesPermissions) {
