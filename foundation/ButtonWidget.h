@@ -1,5 +1,7 @@
 #pragma once
 // The value side of a button-like control: adds the click and message channels to its adaptor.
+#include <type_traits>
+
 #include "foundation/ButtonAdaptor.h"
 #include "foundation/ValWidget.h"
 
@@ -10,6 +12,11 @@ class ButtonWidget : public ValWidget<T> {
 
   using ValWidget<T>::setDataAdaptor;
   void setDataAdaptor(Kw::Ptr<ButtonAdaptor<T>> a) {
+    ValWidget<T>::setDataAdaptor(Kw::Ptr<ValAdaptorBase<T>>(a));
+  }
+  // A pointer to a specialised button adaptor would convert to both overloads above.
+  template <typename A, typename = std::enable_if_t<std::is_base_of_v<ButtonAdaptor<T>, A>>>
+  void setDataAdaptor(Kw::Ptr<A> a) {
     ValWidget<T>::setDataAdaptor(Kw::Ptr<ValAdaptorBase<T>>(a));
   }
   // Null when there is none or the held adaptor is not a button adaptor.
