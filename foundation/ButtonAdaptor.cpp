@@ -1,0 +1,4 @@
+#include "foundation/ButtonAdaptor.h"
+
+template class ButtonAdaptor<String>;
+template class ButtonAdaptor<WString>;

@@ -1,0 +1,4 @@
+#include "foundation/ButtonWidget.h"
+
+template class ButtonWidget<String>;
+template class ButtonWidget<WString>;

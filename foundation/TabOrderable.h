@@ -1,0 +1,51 @@
+#pragma once
+// A control that can take keyboard focus through one or more TabOrderManagers. It keeps the
+// managers it is registered with (once per stop) under its own lock; destroying it removes its
+// stops from every manager, and a manager destroyed first is forgotten.
+//
+// Lock discipline, shared with TabOrderManager: a manager may take this object's lock while
+// holding its own, never the reverse; this object reads its manager list under its lock and
+// calls the managers after releasing it.
+#include <memory>
+#include <vector>
+
+#include "platform/kw/RWLock.h"
+
+class TabOrderManager;
+
+class TabOrderable {
+ public:
+  TabOrderable() = default;
+  virtual ~TabOrderable();
+  TabOrderable(const TabOrderable&) = delete;
+  TabOrderable& operator=(const TabOrderable&) = delete;
+
+  // Whether the control can take focus now (shown, active...).
+  virtual bool isTabStopActive() { return true; }
+  // Called with no manager lock held: the handlers may query or change any manager.
+  virtual void handleTabStopFocusReceipt() {}
+  virtual void handleTabStopFocusLoss() {}
+
+  // True when any of its managers has it as the current stop.
+  bool isTabStopFocus() const;
+  // Clears the focus of every manager whose current stop it is (others keep theirs).
+  void relinquishTabStopFocus();
+  // Asks every manager to focus it; returns isTabStopFocus() afterwards.
+  bool requestTabStopFocus();
+
+  // Called by the managers as stops are added and removed.
+  void registerManager(TabOrderManager* m) const;
+  void deregisterManager(TabOrderManager* m) const;
+  bool isRegisteredWith(const TabOrderManager* m) const;
+  // Each manager once.
+  std::vector<TabOrderManager*> getManagers() const;
+
+ private:
+  friend class TabOrderManager;
+  // A dying manager drops every one of its entries here.
+  void forgetManager(TabOrderManager* m) const;
+
+  mutable std::vector<TabOrderManager*> managers_;
+  Kw::RWLock lock_{1, 100, 1};
+  std::shared_ptr<bool> alive_ = std::make_shared<bool>(true);
+};

@@ -1,0 +1,14 @@
+#include "foundation/WidgetBase.h"
+
+WidgetBase::~WidgetBase() {
+  // Copied: each detachFrom edits the list.
+  const std::vector<AdaptorBase*> from = attachedTo_;
+  for (AdaptorBase* a : from) a->detachFrom(this);
+  adaptor.reset();
+}
+
+void WidgetBase::setAdaptor(Kw::Ptr<AdaptorBase> a) {
+  // Binding to the held adaptor again re-attaches a control that was detached from it.
+  if (!(a == adaptor)) adaptor = std::move(a);
+  if (adaptor) adaptor->attachTo(this);
+}
