@@ -1,0 +1,403 @@
+#include "text/TextEditModel.h"
+
+#include <algorithm>
+
+#include "platform/glob/Event.h"
+#include "text/CharClassifier.h"
+
+namespace {
+using Item = EditHistory::Item;
+using CharClass = CharClassifier::CharClass;
+
+constexpr unsigned kCharacterMask = 0x00FFFFFF;
+}  // namespace
+
+// --- Contents ---
+
+WString TextEditModel::textRange(int from, int to) const {
+  if (from < 0 || to < 0) return {};
+  const int lo = clampIndex(std::min(from, to));
+  const int hi = clampIndex(std::max(from, to));
+  return text_.substr(lo, hi - lo);
+}
+
+bool TextEditModel::setText(const WString& text) {
+  if (text_ == text && hasSaved_ && saved_ == text && !modified_) return false;
+  text_ = text.size() > kMaxLength ? text.substr(0, kMaxLength) : text;
+  ++revision_;
+  saved_ = text_;
+  hasSaved_ = true;
+  modified_ = false;
+  caret_ = length();
+  clearSelection();
+  history_.clear();
+  return true;
+}
+
+void TextEditModel::saveText() {
+  saved_ = text_;
+  hasSaved_ = true;
+}
+
+bool TextEditModel::getChanged() const {
+  return hasSaved_ ? text_ != saved_ : !text_.empty();
+}
+
+// --- Caret and selection ---
+
+int TextEditModel::clampIndex(int index) const {
+  return std::clamp(index, 0, length());
+}
+
+WString TextEditModel::selectedText() const {
+  if (!hasSelection()) return {};
+  return textRange(selectionLow(), selectionHigh());
+}
+
+int TextEditModel::seek(SeekMethod method, int from, int index) const {
+  const int len = length();
+  int i = clampIndex(from);
+  switch (method) {
+    case SeekMethod::PreviousChar:
+      return std::max(i - 1, 0);
+    case SeekMethod::NextChar:
+      return std::min(i + 1, len);
+    case SeekMethod::NextWord:
+      // Over the rest of the word (or punctuation run) under the caret, then over spaces.
+      if (i < len && CharClassifier::classOf(text_[i]) != CharClass::Space) {
+        const wchar_t first = text_[i];
+        while (i < len && CharClassifier::sameCharType(first, text_[i])) ++i;
+      }
+      while (i < len && CharClassifier::classOf(text_[i]) == CharClass::Space) ++i;
+      return i;
+    case SeekMethod::PreviousWord:
+      // Back over spaces, then to the start of the run before them.
+      while (i > 0 && CharClassifier::classOf(text_[i - 1]) == CharClass::Space) --i;
+      if (i > 0) {
+        const wchar_t last = text_[i - 1];
+        while (i > 0 && CharClassifier::sameCharType(last, text_[i - 1])) --i;
+      }
+      return i;
+    case SeekMethod::StartOfText:
+      return 0;
+    case SeekMethod::EndOfText:
+      return len;
+    case SeekMethod::ToIndex:
+      return clampIndex(index);
+  }
+  return i;
+}
+
+void TextEditModel::moveCaret(SeekMethod method, int index) {
+  caret_ = seek(method, caret_, index);
+}
+
+bool TextEditModel::select(int anchor, int caret) {
+  if (anchor < 0 || caret < 0) return false;
+  selStart_ = clampIndex(anchor);
+  selEnd_ = caret_ = clampIndex(caret);
+  return true;
+}
+
+void TextEditModel::dragTo(int index) {
+  if (selStart_ < 0 || selEnd_ != caret_) return;
+  caret_ = selEnd_ = clampIndex(index);
+}
+
+void TextEditModel::highlightAll(bool on) {
+  if (!on) {
+    clearSelection();
+    return;
+  }
+  caret_ = length();
+  if (text_.empty()) {
+    clearSelection();
+  } else {
+    selStart_ = 0;
+    selEnd_ = caret_;
+  }
+}
+
+wchar_t TextEditModel::characterAtCaret() const {
+  return caret_ < length() ? text_[caret_] : L' ';
+}
+
+// --- Settings ---
+
+void TextEditModel::setCharacters(const WString& set, CharacterRestriction restriction) {
+  charSet_ = set;
+  restriction_ = restriction;
+}
+
+bool TextEditModel::isRestricted(wchar_t ch) const {
+  switch (restriction_) {
+    case CharacterRestriction::OnlyListed:
+      return charSet_.find(ch) == WString::npos;
+    case CharacterRestriction::AllButListed:
+      return charSet_.find(ch) != WString::npos;
+    case CharacterRestriction::None:
+      break;
+  }
+  return false;
+}
+
+bool TextEditModel::isAllowed(wchar_t ch) const {
+  if (!CharClassifier::isPrintable(ch) || isRestricted(ch)) return false;
+  if (sizeLimit_ == 0 || text_.size() < sizeLimit_) return true;
+  // At the limit only a character that replaces text fits.
+  return hasSelection() || (mode_ == EditMode::Overwrite && caret_ < length());
+}
+
+// --- Editing ---
+
+void TextEditModel::applyReplace(std::size_t pos, std::size_t removeCount, const WString& insert) {
+  pos = std::min(pos, text_.size());
+  removeCount = std::min(removeCount, text_.size() - pos);
+  text_.replace(pos, removeCount, insert);
+  ++revision_;
+}
+
+bool TextEditModel::addCharacter(wchar_t ch) {
+  if (!isAllowed(ch)) return false;
+  if (mode_ == EditMode::Overwrite && !hasSelection() && caret_ < length()) {
+    select(caret_, seek(SeekMethod::NextChar, caret_));
+  }
+  return paste(WString(1, ch));
+}
+
+bool TextEditModel::paste(const WString& s) {
+  Item item;
+  item.caretBefore = caret_;
+  item.selectionStartBefore = selStart_;
+  item.selectionEndBefore = selEnd_;
+  const bool replacing = hasSelection();
+  item.position = replacing ? selectionLow() : caret_;
+  if (replacing) item.removed = selectedText();
+
+  // Every character is judged against the text as it stands once the selection is gone, so a
+  // paste that starts short of the limit goes in whole.
+  const std::size_t lengthAfterErase = text_.size() - item.removed.size();
+  const bool room = sizeLimit_ == 0 || lengthAfterErase < sizeLimit_;
+  if (room) {
+    std::size_t end = s.size();
+    while (end > 0 && CharClassifier::isLineBreak(s[end - 1])) --end;
+    const std::size_t capacity = kMaxLength - lengthAfterErase;
+    item.inserted.reserve(std::min(end, capacity));
+    for (std::size_t i = 0; i < end && item.inserted.size() < capacity; ++i) {
+      wchar_t ch = s[i];
+      if (CharClassifier::isLineBreak(ch)) {
+        if (ch == L'\r' && i + 1 < end && s[i + 1] == L'\n') ++i;
+        ch = L' ';
+      }
+      if (CharClassifier::isPrintable(ch) && !isRestricted(ch)) item.inserted += ch;
+    }
+  }
+  if (item.removed.empty() && item.inserted.empty()) return false;
+
+  applyReplace(item.position, item.removed.size(), item.inserted);
+  caret_ = item.position + static_cast<int>(item.inserted.size());
+  clearSelection();
+  modified_ = true;
+  item.caretAfter = caret_;
+  history_.record(std::move(item));
+  return true;
+}
+
+bool TextEditModel::pasteUtf8(std::string_view bytes) {
+  return paste(Kw::toWide(bytes));
+}
+
+bool TextEditModel::erase(int from, int to, bool undoable) {
+  if (from < 0 || to < 0) return false;
+  const int lo = clampIndex(std::min(from, to));
+  const int hi = clampIndex(std::max(from, to));
+  if (lo == hi) return false;
+  Item item;
+  if (undoable) {
+    item.position = lo;
+    item.removed = text_.substr(lo, hi - lo);
+    item.caretBefore = caret_;
+    item.selectionStartBefore = selStart_;
+    item.selectionEndBefore = selEnd_;
+    item.caretAfter = lo;
+  }
+  applyReplace(lo, hi - lo, {});
+  caret_ = lo;
+  clearSelection();
+  modified_ = true;
+  if (undoable) history_.record(std::move(item));
+  return true;
+}
+
+bool TextEditModel::eraseSelectedText(bool undoable) {
+  if (!hasSelection()) return false;
+  return erase(selectionLow(), selectionHigh(), undoable);
+}
+
+WString TextEditModel::copyText() const {
+  return hasSelection() ? selectedText() : text_;
+}
+
+WString TextEditModel::cut() {
+  if (!hasSelection()) highlightAll(true);
+  WString out = selectedText();
+  eraseSelectedText(true);
+  return out;
+}
+
+bool TextEditModel::isContiguousTyping(std::span<const Item> items) {
+  if (items.size() < 2) return false;
+  for (std::size_t i = 0; i + 1 < items.size(); ++i) {
+    const Item& newer = items[i];
+    const Item& older = items[i + 1];
+    if (!newer.isTyping() || !older.isTyping() || newer.position != older.position + 1) {
+      return false;
+    }
+  }
+  return true;
+}
+
+void TextEditModel::revertGroup(std::span<const Item> items) {
+  const Item& oldest = items.back();
+  if (isContiguousTyping(items)) {
+    // A typed word goes in one erase rather than one per character.
+    applyReplace(oldest.position, items.size(), {});
+  } else {
+    for (const Item& item : items) applyReplace(item.position, item.inserted.size(), item.removed);
+  }
+  caret_ = clampIndex(oldest.caretBefore);
+  selStart_ = oldest.selectionStartBefore < 0 ? -1 : clampIndex(oldest.selectionStartBefore);
+  selEnd_ = oldest.selectionEndBefore < 0 ? -1 : clampIndex(oldest.selectionEndBefore);
+  if (selStart_ < 0 || selEnd_ < 0) clearSelection();
+  modified_ = true;
+}
+
+void TextEditModel::replayGroup(std::span<const Item> items) {
+  if (isContiguousTyping(items)) {
+    WString word;
+    word.reserve(items.size());
+    for (auto it = items.rbegin(); it != items.rend(); ++it) word += it->inserted;
+    applyReplace(items.back().position, 0, word);
+  } else {
+    for (auto it = items.rbegin(); it != items.rend(); ++it) {
+      applyReplace(it->position, it->removed.size(), it->inserted);
+    }
+  }
+  caret_ = clampIndex(items.front().caretAfter);
+  clearSelection();
+  modified_ = true;
+}
+
+bool TextEditModel::undo() {
+  return history_.undo([this](std::span<const Item> items) { revertGroup(items); });
+}
+
+bool TextEditModel::redo() {
+  return history_.redo([this](std::span<const Item> items) { replayGroup(items); });
+}
+
+bool TextEditModel::revertToSaved() {
+  if (!hasSaved_) return false;
+  if (text_ != saved_) {
+    // Record only the stretch between the common start and the common end.
+    const std::size_t shorter = std::min(text_.size(), saved_.size());
+    std::size_t prefix = 0;
+    while (prefix < shorter && text_[prefix] == saved_[prefix]) ++prefix;
+    std::size_t suffix = 0;
+    while (suffix < shorter - prefix &&
+           text_[text_.size() - 1 - suffix] == saved_[saved_.size() - 1 - suffix]) {
+      ++suffix;
+    }
+    Item item;
+    item.position = static_cast<int>(prefix);
+    item.removed = text_.substr(prefix, text_.size() - prefix - suffix);
+    item.inserted = saved_.substr(prefix, saved_.size() - prefix - suffix);
+    item.caretBefore = caret_;
+    item.selectionStartBefore = selStart_;
+    item.selectionEndBefore = selEnd_;
+    item.caretAfter = static_cast<int>(saved_.size());
+    applyReplace(prefix, item.removed.size(), item.inserted);
+    history_.record(std::move(item));
+  }
+  highlightAll(true);
+  modified_ = false;
+  return true;
+}
+
+// --- Keys ---
+
+bool TextEditModel::isCharacterKey(unsigned key) {
+  return (key & ~kKeyShift & ~kCharacterMask) == 0;
+}
+
+bool TextEditModel::handleKey(unsigned key) {
+  const bool shift = key & kKeyShift;
+  const bool ctrl = key & kKeyCtrl;
+  if (isCharacterKey(key)) {
+    const auto ch = static_cast<wchar_t>(key & kCharacterMask);
+    if (CharClassifier::isPrintable(ch)) {
+      if (isAllowed(ch)) {
+        addCharacter(ch);
+        return true;
+      }
+      // A character the filter refuses is swallowed; one refused only for want of room
+      // travels on to the owner.
+      return isRestricted(ch);
+    }
+  }
+  const unsigned code = key & ~(kKeyShift | kKeyCtrl);
+  switch (code) {
+    case kKeyBackspace:
+      return eraseKey(false, ctrl);
+    case kKeyDelete:
+      return eraseKey(true, ctrl);
+    case kKeyEscape:
+      return revertToSaved();
+    case kKeyHome:
+    case kKeyLeft:
+    case kKeyRight:
+    case kKeyEnd:
+      return handleCaretKey(code, ctrl, shift);
+    default:
+      return false;  // Tab, Enter and the shortcuts belong to the text box
+  }
+}
+
+bool TextEditModel::eraseKey(bool forward, bool ctrl) {
+  if (hasSelection()) {
+    eraseSelectedText(true);
+  } else if (forward) {
+    erase(caret_, seek(ctrl ? SeekMethod::NextWord : SeekMethod::NextChar, caret_), true);
+  } else if (caret_ > 0) {
+    erase(seek(ctrl ? SeekMethod::PreviousWord : SeekMethod::PreviousChar, caret_), caret_, true);
+  }
+  return true;
+}
+
+bool TextEditModel::handleCaretKey(unsigned code, bool ctrl, bool shift) {
+  if (shift && !hasSelection()) anchorSelection();
+  const int len = length();
+  switch (code) {
+    case kKeyHome:
+      if (caret_ > 0) moveCaret(SeekMethod::StartOfText);
+      break;
+    case kKeyLeft:
+      if (caret_ > 0) moveCaret(ctrl ? SeekMethod::PreviousWord : SeekMethod::PreviousChar);
+      break;
+    case kKeyRight:
+      if (caret_ < len) moveCaret(ctrl ? SeekMethod::NextWord : SeekMethod::NextChar);
+      break;
+    case kKeyEnd:
+      if (caret_ < len) moveCaret(SeekMethod::EndOfText);
+      break;
+    default:
+      return false;
+  }
+  if (shift) {
+    selStart_ = std::max(selStart_, 0);
+    selEnd_ = caret_;
+  } else {
+    clearSelection();
+  }
+  return true;
+}
