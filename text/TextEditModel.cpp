@@ -143,9 +143,15 @@ bool TextEditModel::isRestricted(wchar_t ch) const {
 
 bool TextEditModel::isAllowed(wchar_t ch) const {
   if (!CharClassifier::isPrintable(ch) || isRestricted(ch)) return false;
-  if (sizeLimit_ == 0 || text_.size() < sizeLimit_) return true;
-  // At the limit only a character that replaces text fits.
-  return hasSelection() || (mode_ == EditMode::Overwrite && caret_ < length());
+  if (sizeLimit_ == 0) return true;
+  // Judged as paste judges it: by the length once the text that the character replaces is gone.
+  std::size_t replaced = 0;
+  if (hasSelection()) {
+    replaced = selectionHigh() - selectionLow();
+  } else if (mode_ == EditMode::Overwrite && caret_ < length()) {
+    replaced = 1;
+  }
+  return text_.size() - replaced < sizeLimit_;
 }
 
 // --- Editing ---
@@ -160,22 +166,26 @@ void TextEditModel::applyReplace(std::size_t pos, std::size_t removeCount, const
 bool TextEditModel::addCharacter(wchar_t ch) {
   if (!isAllowed(ch)) return false;
   if (mode_ == EditMode::Overwrite && !hasSelection() && caret_ < length()) {
-    select(caret_, seek(SeekMethod::NextChar, caret_));
+    return replaceRange(caret_, seek(SeekMethod::NextChar, caret_), WString(1, ch));
   }
   return paste(WString(1, ch));
 }
 
 bool TextEditModel::paste(const WString& s) {
+  if (hasSelection()) return replaceRange(selectionLow(), selectionHigh(), s);
+  return replaceRange(caret_, caret_, s);
+}
+
+bool TextEditModel::replaceRange(int from, int to, const WString& s) {
   Item item;
   item.caretBefore = caret_;
   item.selectionStartBefore = selStart_;
   item.selectionEndBefore = selEnd_;
-  const bool replacing = hasSelection();
-  item.position = replacing ? selectionLow() : caret_;
-  if (replacing) item.removed = selectedText();
+  item.position = from;
+  item.removed = text_.substr(from, to - from);
 
-  // Every character is judged against the text as it stands once the selection is gone, so a
-  // paste that starts short of the limit goes in whole.
+  // Every character is judged against the text as it stands once the replaced text is gone,
+  // so a paste that starts short of the limit goes in whole.
   const std::size_t lengthAfterErase = text_.size() - item.removed.size();
   const bool room = sizeLimit_ == 0 || lengthAfterErase < sizeLimit_;
   if (room) {
@@ -225,7 +235,11 @@ bool TextEditModel::erase(int from, int to, bool undoable) {
   caret_ = lo;
   clearSelection();
   modified_ = true;
-  if (undoable) history_.record(std::move(item));
+  if (undoable) {
+    history_.record(std::move(item));
+  } else {
+    history_.clear();  // the recorded positions no longer fit the text
+  }
   return true;
 }
 

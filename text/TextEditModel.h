@@ -11,9 +11,11 @@
 //
 // Decisions where the text box leaves room:
 //   - Printable means `CharClassifier::isPrintable`, a fixed table independent of the locale.
-//   - The size limit refuses a typed character when the text is at or above the limit (a paste
-//     may have overrun it), unless the character will replace text: a selection exists, or the
-//     mode is overwrite and the caret is before the end.
+//   - The size limit is judged on the length once the text that an edit replaces is gone (the
+//     selection, or in overwrite mode the character after the caret): a typed character is
+//     refused when that length is at or above the limit. A paste that starts short of the limit
+//     goes in whole and may overrun it; the text then takes no more characters, and a typed
+//     character that replaces one is refused until the text is back under the limit.
 //   - Paste turns each line break (CR LF counts as one) into a space and drops line breaks at
 //     the end of the pasted text; then every character passes the filter as typing does
 //     (control characters and TAB are dropped). `pasteUtf8` decodes first: malformed bytes
@@ -139,7 +141,8 @@ class TextEditModel {
   bool paste(const WString& s);
   bool pasteUtf8(std::string_view bytes);
   // Removes [from, to) in either order (clamped), caret to the start, selection cleared.
-  // Returns true when something was removed.
+  // Returns true when something was removed. An erase that is not undoable clears the undo
+  // and redo lists, which could no longer describe the text.
   bool erase(int from, int to, bool undoable);
   bool eraseSelectedText(bool undoable);
   // The text for the clipboard: the selection, or the whole text when there is none.
@@ -167,6 +170,9 @@ class TextEditModel {
   bool handleCaretKey(unsigned code, bool ctrl, bool shift);
   bool eraseKey(bool forward, bool ctrl);
 
+  // Replaces [from, to) by the characters of `s` that the filter and the limit keep, with an
+  // undo item; the caret and selection at the call are the item's state before.
+  bool replaceRange(int from, int to, const WString& s);
   void applyReplace(std::size_t pos, std::size_t removeCount, const WString& insert);
   void revertGroup(std::span<const EditHistory::Item> items);
   void replayGroup(std::span<const EditHistory::Item> items);
