@@ -40,7 +40,17 @@ constexpr unsigned kKeyShift = 0x01000000;
 constexpr unsigned kKeyCtrl = 0x02000000;
 constexpr unsigned kKeyAlt = 0x04000000;
 constexpr unsigned kKeyScanCode = 0x08000000;
+// Marks the three clipboard shortcuts: Ctrl+C, Ctrl+X and Ctrl+V arrive as
+// kKeyClipboard | kKeyCtrl | the upper-case letter (Ctrl+C = 0x22000043), Shift added when held.
+// Every other Ctrl or Alt combination with a character key is the modifier bits | the character,
+// letters upper-cased (Ctrl+Z = 0x0200005A). Characters typed without Ctrl or Alt arrive as the
+// bare character, with no modifier bits: the character already says whether Shift was held.
+constexpr unsigned kKeyClipboard = 0x20000000;
 constexpr unsigned kKeyModifierMask = kKeyShift | kKeyCtrl | kKeyAlt;
+
+// The message carrying text composed by an input method (or several characters committed at
+// once). It goes to the keyboard focus; the composed UTF-8 text is the event's payload().
+constexpr const char* kMsgCompoundTextInput = "CompoundTextInput";
 
 class Event {
  public:
@@ -61,6 +71,10 @@ class Event {
   const char* msg() const { return text_.c_str(); }
   const String& text() const { return text_; }
   void message(const String& m) { text_ = m; }
+  // Data that travels with a message beside its text, for messages whose text only names them
+  // (kMsgCompoundTextInput carries the composed UTF-8 text here). Empty for most messages.
+  const String& payload() const { return payload_; }
+  void setPayload(const String& data) { payload_ = data; }
 
   // Pointer offset from the press point.
   XY<int> distance() const { return screenPos - pressPos; }
@@ -74,6 +88,7 @@ class Event {
 
  private:
   String text_;
+  String payload_;
   Glob* sender_ = nullptr;
   uint64_t senderSerial_ = 0;
 };

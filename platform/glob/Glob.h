@@ -62,6 +62,8 @@ class Glob : public CanvasClient, public Drawable {
   virtual bool m_is_type(const char* type) const;
   virtual void set_can_be_it(int canBeIt) { canBeIt_ = canBeIt != 0; }
   virtual bool can_be_it() const { return canBeIt_; }
+  // The label or value the Glob shows, for tools that list the tree (empty when none).
+  virtual String describeValue() const { return String(); }
 
   // --- CanvasClient ---
   const char* idstring() const override { return "glob"; }

@@ -1,0 +1,266 @@
+#include "platform/backend/WindowBackend.h"
+
+#include <algorithm>
+#include <cstdlib>
+
+#include "platform/glib/CairoPaintSession.h"
+#include "platform/misc/Diagnostics.h"
+#include "platform/os/OS.h"
+
+namespace {
+
+bool displayAvailable() {
+  const char* x = std::getenv("DISPLAY");
+  const char* w = std::getenv("WAYLAND_DISPLAY");
+  return (x && *x) || (w && *w);
+}
+
+// Writes the part `area` (top-down pixels) of `source` to a PNG file.
+bool writePng(cairo_surface_t* source, const Kw::Box<int>& area, const String& path) {
+  if (area.empty()) {
+    diagWarning("screenshot: nothing visible to write to " + path + "\n");
+    return false;
+  }
+  cairo_surface_t* out =
+      cairo_image_surface_create(CAIRO_FORMAT_ARGB32, area.width(), area.height());
+  cairo_t* cr = cairo_create(out);
+  cairo_set_source_surface(cr, source, -area.x0, -area.y0);
+  cairo_set_operator(cr, CAIRO_OPERATOR_SOURCE);
+  cairo_paint(cr);
+  cairo_destroy(cr);
+  const cairo_status_t status = cairo_surface_write_to_png(out, path.c_str());
+  cairo_surface_destroy(out);
+  if (status != CAIRO_STATUS_SUCCESS) {
+    diagError("screenshot: cannot write " + path + ": " + cairo_status_to_string(status) + "\n");
+    return false;
+  }
+  return true;
+}
+
+}  // namespace
+
+std::unique_ptr<WindowBackend> WindowBackend::open(const String& title, int width, int height) {
+  if (!displayAvailable()) {
+    diagWarning("window: no display (DISPLAY and WAYLAND_DISPLAY are unset)\n");
+    return nullptr;
+  }
+  std::unique_ptr<WindowBackend> b(new WindowBackend());
+  if (!b->create(title, std::max(1, width), std::max(1, height))) return nullptr;
+  return b;
+}
+
+bool WindowBackend::create(const String& title, int width, int height) {
+  if (SDL_InitSubSystem(SDL_INIT_VIDEO) != 0) {
+    diagWarning(String("window: SDL cannot start its video: ") + SDL_GetError() + "\n");
+    return false;
+  }
+  sdlStarted_ = true;
+  window_ = SDL_CreateWindow(title.c_str(), SDL_WINDOWPOS_CENTERED, SDL_WINDOWPOS_CENTERED, width,
+                             height, SDL_WINDOW_RESIZABLE | SDL_WINDOW_ALLOW_HIGHDPI);
+  if (!window_) {
+    diagWarning(String("window: SDL cannot open a window: ") + SDL_GetError() + "\n");
+    return false;
+  }
+  renderer_ = SDL_CreateRenderer(window_, -1, 0);
+  if (!renderer_) renderer_ = SDL_CreateRenderer(window_, -1, SDL_RENDERER_SOFTWARE);
+  if (!renderer_) {
+    diagWarning(String("window: SDL cannot draw into the window: ") + SDL_GetError() + "\n");
+    return false;
+  }
+  SDL_GetWindowSize(window_, &geometry_.windowWidth, &geometry_.windowHeight);
+  SDL_GetRendererOutputSize(renderer_, &geometry_.rootWidth, &geometry_.rootHeight);
+  root_ = std::make_unique<RootGlob>(geometry_.rootWidth, geometry_.rootHeight);
+  if (!makeSurfaces()) return false;
+  cursors_ = std::make_unique<SdlCursorSet>();
+  SDL_StartTextInput();
+  OS()->keyboard().setModifiers(SdlInputTranslator::modifierBits(SDL_GetModState()));
+  return true;
+}
+
+WindowBackend::~WindowBackend() {
+  // The Globs go first: they may still reach the screen while they are deleted.
+  root_.reset();
+  cursors_.reset();
+  releaseSurfaces();
+  if (renderer_) SDL_DestroyRenderer(renderer_);
+  if (window_) SDL_DestroyWindow(window_);
+  if (sdlStarted_) {
+    SDL_StopTextInput();
+    SDL_QuitSubSystem(SDL_INIT_VIDEO);
+    SDL_Quit();
+  }
+  OS()->keyboard().setModifiers(0);
+}
+
+bool WindowBackend::makeSurfaces() {
+  const int w = std::max(1, geometry_.rootWidth);
+  const int h = std::max(1, geometry_.rootHeight);
+  surface_ = cairo_image_surface_create(CAIRO_FORMAT_ARGB32, w, h);
+  if (cairo_surface_status(surface_) != CAIRO_STATUS_SUCCESS) {
+    diagError("window: cannot make a " + std::to_string(w) + "x" + std::to_string(h) + " image\n");
+    return false;
+  }
+  session_ = std::make_unique<Glib::CairoPaintSession>(surface_);
+  // Cairo's ARGB32 is a native-endian 32-bit word with alpha on top: SDL's ARGB8888.
+  texture_ =
+      SDL_CreateTexture(renderer_, SDL_PIXELFORMAT_ARGB8888, SDL_TEXTUREACCESS_STREAMING, w, h);
+  if (!texture_) {
+    diagError(String("window: SDL cannot make a texture: ") + SDL_GetError() + "\n");
+    return false;
+  }
+  SDL_SetTextureBlendMode(texture_, SDL_BLENDMODE_NONE);
+  needsPresent_ = true;
+  return true;
+}
+
+void WindowBackend::releaseSurfaces() {
+  session_.reset();
+  if (surface_) cairo_surface_destroy(surface_);
+  surface_ = nullptr;
+  if (texture_) SDL_DestroyTexture(texture_);
+  texture_ = nullptr;
+}
+
+double WindowBackend::pixelScale() const {
+  return static_cast<double>(geometry_.rootWidth) / std::max(1, geometry_.windowWidth);
+}
+
+// --- The loop ---
+
+bool WindowBackend::step(int waitMs) {
+  // Wake in time for the next tick even when no input comes.
+  const int wait = std::clamp(waitMs, 0, root_->tickPeriod());
+  SDL_Event event;
+  if (wait > 0 ? SDL_WaitEventTimeout(&event, wait) : SDL_PollEvent(&event)) {
+    handle(event);
+    while (!quit_ && SDL_PollEvent(&event)) handle(event);
+  }
+  root_->processTimers();
+  root_->pumpQueue();
+  cursors_->show(root_->cursorAtPointer());
+  followFocus();
+  render();
+  return !quit_;
+}
+
+void WindowBackend::handle(const SDL_Event& event) {
+  // Events of other windows (there are none of ours) are not for this screen.
+  if (event.type == SDL_WINDOWEVENT && event.window.windowID != windowId()) return;
+  for (const TranslatedInput& input : translator_.translate(event, geometry_)) apply(input);
+}
+
+void WindowBackend::apply(const TranslatedInput& in) {
+  using Kind = TranslatedInput::Kind;
+  switch (in.kind) {
+    case Kind::Mouse:
+      // Controls read the modifiers of a click from OS().
+      OS()->keyboard().setModifiers(SdlInputTranslator::modifierBits(SDL_GetModState()));
+      root_->injectMouse(in.type, in.pos, in.wheelSteps);
+      break;
+    case Kind::Key:
+      root_->injectKey(in.type, in.keyCode);
+      break;
+    case Kind::ComposedText:
+      deliverComposedText(in.text);
+      break;
+    case Kind::Modifiers:
+      OS()->keyboard().setModifiers(in.modifiers);
+      break;
+    case Kind::Resized:
+      fitToWindow();
+      break;
+    case Kind::Exposed:
+      needsPresent_ = true;
+      break;
+    case Kind::FocusLost:
+      OS()->keyboard().setModifiers(0);
+      break;
+    case Kind::Quit:
+      quit_ = true;
+      break;
+  }
+}
+
+void WindowBackend::deliverComposedText(const String& utf8) {
+  Glob* focus = root_->focus();
+  if (!focus) return;
+  Event e(kEventMessage);
+  e.message(kMsgCompoundTextInput);
+  e.setPayload(utf8);
+  e.dest = focus;
+  e.canvas = focus->canvas();
+  event_send(&e, false);
+}
+
+void WindowBackend::fitToWindow() {
+  WindowGeometry g;
+  SDL_GetWindowSize(window_, &g.windowWidth, &g.windowHeight);
+  SDL_GetRendererOutputSize(renderer_, &g.rootWidth, &g.rootHeight);
+  const bool resized = g.rootWidth != geometry_.rootWidth || g.rootHeight != geometry_.rootHeight;
+  geometry_ = g;
+  if (!resized) return;
+  releaseSurfaces();
+  // Reshaping the root damages all of it, so the next repaint fills the new image.
+  root_->reshape_canvas(0, 0, g.rootWidth, g.rootHeight);
+  if (!makeSurfaces()) quit_ = true;
+}
+
+void WindowBackend::followFocus() {
+  // Puts the input method's window under the Glob that receives typed text.
+  Glob* focus = root_->focus();
+  if (inputFocus_.refersTo(focus) && inputFocus_.alive()) return;
+  inputFocus_ = GlobHandle<>(focus);
+  if (!focus) return;
+  const Kw::Box<int> r = focus->canvas()->rootRect();
+  const double s = std::max(pixelScale(), 1e-6);
+  SDL_Rect rect{static_cast<int>(r.x0 / s), static_cast<int>((geometry_.rootHeight - r.y1) / s),
+                static_cast<int>(r.width() / s), static_cast<int>(r.height() / s)};
+  SDL_SetTextInputRect(&rect);
+}
+
+// --- Painting ---
+
+void WindowBackend::render() {
+  if (!session_) return;
+  if (root_->paint(*session_)) upload(session_->presentedAreas());
+  present();
+}
+
+void WindowBackend::upload(const std::vector<Kw::Box<int>>& areas) {
+  const Kw::Box<int> bounds(0, 0, cairo_image_surface_get_width(surface_),
+                            cairo_image_surface_get_height(surface_));
+  const unsigned char* pixels = cairo_image_surface_get_data(surface_);
+  const int stride = cairo_image_surface_get_stride(surface_);
+  for (const auto& a : areas) {
+    const Kw::Box<int> r = a.intersection(bounds);
+    if (r.empty()) continue;
+    const SDL_Rect rect{r.x0, r.y0, r.width(), r.height()};
+    SDL_UpdateTexture(texture_, &rect, pixels + r.y0 * stride + r.x0 * 4, stride);
+    needsPresent_ = true;
+  }
+}
+
+void WindowBackend::present() {
+  if (!needsPresent_ || !texture_) return;
+  needsPresent_ = false;
+  // The window's back buffer is not kept between frames, so the whole texture is copied; only
+  // the changed rectangles travel from the image to the texture.
+  SDL_RenderCopy(renderer_, texture_, nullptr, nullptr);
+  SDL_RenderPresent(renderer_);
+}
+
+bool WindowBackend::screenshot(const String& pngPath) {
+  render();
+  return writePng(surface_, Kw::Box<int>(0, 0, geometry_.rootWidth, geometry_.rootHeight), pngPath);
+}
+
+bool WindowBackend::screenshot(const Glob& glob, const String& pngPath) {
+  if (!is_good_glob_ptr(&glob) || glob.root() != root_.get()) {
+    diagWarning("screenshot: the Glob is not on this screen: " + pngPath + " not written\n");
+    return false;
+  }
+  render();
+  const Kw::Box<int> v = glob.canvas()->visibleRootRect();
+  const int h = geometry_.rootHeight;
+  return writePng(surface_, Kw::Box<int>(v.x0, h - v.y1, v.x1, h - v.y0), pngPath);
+}

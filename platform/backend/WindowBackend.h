@@ -1,0 +1,72 @@
+#pragma once
+// The screen in a real, resizable SDL window. Each step takes the window's input and feeds it
+// to the root, fires due ticks, delivers queued messages, repaints the damage into a Cairo
+// image and uploads only the changed rectangles to the window's texture. While it lives the
+// keyboard modifiers of OS() follow the real keys, the pointer takes the shape the Glob under it
+// asks for, and the library's clipboard is the system's.
+//
+// The root counts drawable pixels: on a HiDPI screen it is larger than the window's size in
+// window units, by pixelScale(), and pointer positions are scaled to match.
+#include <SDL.h>
+
+#include <memory>
+
+#include "platform/backend/Backend.h"
+#include "platform/backend/SdlCursorSet.h"
+#include "platform/backend/SdlInputTranslator.h"
+#include "platform/glob/GlobHandle.h"
+
+namespace Glib {
+class CairoPaintSession;
+}
+
+class WindowBackend : public Backend {
+ public:
+  // Opens a window of `width` x `height` window units. Null when there is no display or SDL
+  // cannot make the window (the reason goes through Diagnostics); callers fall back to a
+  // headless screen.
+  static std::unique_ptr<WindowBackend> open(const String& title, int width, int height);
+  ~WindowBackend() override;
+  WindowBackend(const WindowBackend&) = delete;
+  WindowBackend& operator=(const WindowBackend&) = delete;
+
+  RootGlob& root() override { return *root_; }
+  bool step(int waitMs) override;
+  cairo_surface_t* surface() override { return surface_; }
+  void render() override;
+  bool screenshot(const String& pngPath) override;
+  bool screenshot(const Glob& glob, const String& pngPath) override;
+
+  // Drawable pixels per window unit, across.
+  double pixelScale() const;
+  const WindowGeometry& geometry() const { return geometry_; }
+  // The window's identifier in SDL's numbering.
+  Uint32 windowId() const { return SDL_GetWindowID(window_); }
+
+ private:
+  WindowBackend() = default;
+  bool create(const String& title, int width, int height);
+  void handle(const SDL_Event& event);
+  void apply(const TranslatedInput& input);
+  void deliverComposedText(const String& utf8);
+  void fitToWindow();
+  bool makeSurfaces();
+  void releaseSurfaces();
+  void upload(const std::vector<Kw::Box<int>>& topDownAreas);
+  void present();
+  void followFocus();
+
+  SDL_Window* window_ = nullptr;
+  SDL_Renderer* renderer_ = nullptr;
+  SDL_Texture* texture_ = nullptr;
+  cairo_surface_t* surface_ = nullptr;
+  std::unique_ptr<Glib::CairoPaintSession> session_;
+  std::unique_ptr<RootGlob> root_;
+  std::unique_ptr<SdlCursorSet> cursors_;
+  SdlInputTranslator translator_;
+  WindowGeometry geometry_;
+  GlobHandle<> inputFocus_;  // the Glob the input method's window is placed at
+  bool sdlStarted_ = false;
+  bool needsPresent_ = true;
+  bool quit_ = false;
+};
