@@ -1,0 +1,22 @@
+#pragma once
+// The gallery's command line:
+//   --headless          no window, even when a display is available
+//   --screenshot DIR    every page to DIR/page-NAME.png (each path printed), then exit
+//   --log FILE          the message log also written to FILE, one line per message
+//   --dump-tree         the Glob tree as JSON on stdout once the first frame is shown
+//   --size WxH          the window's size in window units (default 1280x820)
+#include "platform/kw/String.h"
+
+struct GalleryOptions {
+  bool headless = false;
+  bool dumpTree = false;
+  bool help = false;
+  String screenshotDir;
+  String logFile;
+  int width = 1280;
+  int height = 820;
+
+  // Reads the arguments; false with `error` set when they make no sense.
+  bool parse(int argc, char** argv, String& error);
+  static const char* usage();
+};

@@ -1,0 +1,19 @@
+#include "gallery/GalleryPages.h"
+
+const std::vector<GalleryPageSpec>& galleryPages() {
+  static const std::vector<GalleryPageSpec> pages = {
+      {"Foundation",
+       "Globs, message delivery and the keyboard: the ground every control stands on.",
+       buildFoundationPage},
+      {"Buttons", "Push, latching and pressure buttons, and the buttons of a panel's title strip.",
+       buildButtonsPage},
+      {"Check boxes & radio sets", "Check boxes, tri-state boxes and one-of-many choices.",
+       buildChecksPage},
+      {"Text", "Single-line text entry, labels, titled text and tooltips.", buildTextPage},
+      {"Menus", "Pop-up menus, drop-down buttons and combo boxes.", buildMenusPage},
+      {"Values", "Value boxes with their parsers, sliders and scroll bars.", buildValuesPage},
+      {"Lists", "Cells addressed by column and row, fed by a data supplier.", buildListsPage},
+      {"Panels", "Standard panels, tabbed dialogues and widget groups.", buildPanelsPage},
+  };
+  return pages;
+}

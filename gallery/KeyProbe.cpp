@@ -1,0 +1,108 @@
+#include "gallery/KeyProbe.h"
+
+#include <cstdio>
+
+#include "gallery/GalleryStyle.h"
+
+using namespace GalleryStyle;
+
+KeyProbe::KeyProbe(const GlobCreationInfo& info) : Glob(info) {
+  set_name("Key probe");
+}
+
+String KeyProbe::keyName(unsigned code) {
+  String name;
+  if (code & kKeyCtrl) name += "Ctrl+";
+  if (code & kKeyAlt) name += "Alt+";
+  if (code & kKeyShift) name += "Shift+";
+  const unsigned low = code & 0x00FFFFFF;
+  if (code & kKeyScanCode) {
+    switch (low) {
+      case 0x47:
+        return name + "Home";
+      case 0x48:
+        return name + "Up";
+      case 0x49:
+        return name + "PageUp";
+      case 0x4B:
+        return name + "Left";
+      case 0x4D:
+        return name + "Right";
+      case 0x4F:
+        return name + "End";
+      case 0x50:
+        return name + "Down";
+      case 0x51:
+        return name + "PageDown";
+      case 0x52:
+        return name + "Insert";
+      case 0x53:
+        return name + "Delete";
+      default: {
+        char buf[24];
+        std::snprintf(buf, sizeof buf, "scan 0x%02X", low);
+        return name + buf;
+      }
+    }
+  }
+  switch (low) {
+    case 8:
+      return name + "Backspace";
+    case 9:
+      return name + "Tab";
+    case 13:
+      return name + "Return";
+    case 27:
+      return name + "Escape";
+    case 32:
+      return name + "Space";
+    default:
+      break;
+  }
+  if (low > 32 && low < 127) return name + static_cast<char>(low);
+  char buf[24];
+  std::snprintf(buf, sizeof buf, "U+%04X", low);
+  if (low < 0xA0) return name + buf;
+  return name + Kw::toUtf8(WString(1, static_cast<wchar_t>(low))) + " (" + buf + ")";
+}
+
+void KeyProbe::show(const String& line, const String& message) {
+  shown_ = line;
+  update();
+  if (Glob* owner = parent()) send_msg(owner, message.c_str());
+}
+
+int KeyProbe::react(Event* e) {
+  if (mouse_left_event(e) && mouse_down_event(e)) {
+    set_kbd_focus();
+    return 1;
+  }
+  if (key_press_event(e)) {
+    char hex[16];
+    std::snprintf(hex, sizeof hex, "0x%08X", e->keyCode());
+    const String name = keyName(e->keyCode());
+    show(String(hex) + "   " + name, "key " + String(hex) + " " + name);
+    return 1;
+  }
+  if (message_event(e) && e->text() == kMsgCompoundTextInput) {
+    show("composed \"" + e->payload() + "\"", "composed " + e->payload());
+    return 1;
+  }
+  return Glob::react(e);
+}
+
+void KeyProbe::draw() {
+  ChromePainter p(*canvas());
+  if (!p.active()) return;
+  const Kw::Box<int> b = p.bounds();
+  const bool focused = get_kbd_focus() == this;
+  p.roundedRect(b, 4, Colour::fromHex(0x25272B));
+  p.roundedOutline(b, 4, focused ? kAccentSoft : kCardEdge);
+  const Kw::Box<int> inner(b.x0 + 12, b.y0, b.x1 - 12, b.y1);
+  if (shown_.empty()) {
+    p.text(focused ? "Press any key\xE2\x80\xA6" : "Click here, then press keys", inner, kBodyFont,
+           kTextFaint);
+  } else {
+    p.text(shown_, inner, kMonoFont, kTextStrong);
+  }
+}
