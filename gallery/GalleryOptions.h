@@ -1,6 +1,7 @@
 #pragma once
 // The gallery's command line:
-//   --headless          no window, even when a display is available
+//   --headless          no window, even when a display is available; with nothing else
+//                       asked, every page is written as a PNG into a new directory in /tmp
 //   --screenshot DIR    every page to DIR/page-NAME.png (each path printed), then exit
 //   --log FILE          the message log also written to FILE, one line per message
 //   --dump-tree         the Glob tree as JSON on stdout once the first frame is shown

@@ -40,7 +40,7 @@ String TreeDump::toJson(const Glob& root, double pixelScale) {
                 static_cast<int>(std::lround(root.height() / scale)), scale);
   out += head;
   node(root, root.height(), scale, 0, out);
-  out += "}\n";
+  out += "\n}\n";
   return out;
 }
 

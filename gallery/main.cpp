@@ -1,5 +1,6 @@
 // The gallery: every control of the library on a page per subsystem, in a window when there is
 // a display and headless otherwise, with a live log of the messages the controls send.
+#include <stdlib.h>
 #include <sys/stat.h>
 
 #include <cctype>
@@ -87,7 +88,15 @@ int main(int argc, char** argv) {
   } else if (window) {
     while (window->step(16)) app->fitToScreen();
   } else if (!options.dumpTree) {
-    std::fprintf(stderr, "globkit-gallery: headless with nothing to do; try --screenshot DIR\n");
+    // Headless with nothing asked: the pages as pictures are what there is to show.
+    char dir[] = "/tmp/globkit-gallery-XXXXXX";
+    if (::mkdtemp(dir)) {
+      std::fprintf(stderr, "globkit-gallery: every page written as a PNG:\n");
+      status = writeScreenshots(screen, *app, dir);
+    } else {
+      std::fprintf(stderr, "globkit-gallery: cannot make a directory for the screenshots\n");
+      status = 1;
+    }
   }
   app.reset();
   return status;

@@ -1,0 +1,141 @@
+#!/usr/bin/env bash
+# End to end: the gallery in a real window on a private X server, driven with real X input.
+# It finds controls through --dump-tree, clicks them with xdotool and looks for their messages
+# in the --log file; then it asks the gallery to quit and expects a clean exit.
+# usage: gallery_click.sh path/to/globkit-gallery
+# Exits 77 (skipped) only when Xvfb or xdotool cannot be run at all.
+set -u
+
+gallery="${1:?usage: gallery_click.sh path/to/globkit-gallery}"
+readonly SKIP=77
+readonly TIMEOUT_S=30
+
+for tool in Xvfb xdotool; do
+  if ! command -v "$tool" >/dev/null 2>&1; then
+    echo "SKIP: $tool is not installed (tools/bootstrap installs it)"
+    exit $SKIP
+  fi
+done
+
+work="$(mktemp -d)"
+xvfb_pid=""
+gallery_pid=""
+
+cleanup() {
+  for pid in "$gallery_pid" "$xvfb_pid"; do
+    if [ -n "$pid" ] && kill -0 "$pid" 2>/dev/null; then
+      kill "$pid" 2>/dev/null
+      for _ in $(seq 50); do kill -0 "$pid" 2>/dev/null || break; sleep 0.1; done
+      kill -9 "$pid" 2>/dev/null
+    fi
+  done
+  wait 2>/dev/null
+  rm -rf "$work"
+}
+trap cleanup EXIT
+
+fail() {
+  echo "FAIL: $*"
+  for f in gallery.err log tree.json; do
+    [ -s "$work/$f" ] && { echo "--- $f"; head -c 4000 "$work/$f"; echo; }
+  done
+  exit 1
+}
+
+# Polls `condition` (a command) every 0.1 s until it succeeds or the timeout passes.
+wait_for() {
+  local what="$1"
+  shift
+  local deadline=$((SECONDS + TIMEOUT_S))
+  until "$@"; do
+    [ $SECONDS -lt $deadline ] || fail "timed out waiting for $what"
+    if [ -n "$gallery_pid" ] && ! kill -0 "$gallery_pid" 2>/dev/null; then
+      fail "the gallery exited while waiting for $what"
+    fi
+    sleep 0.1
+  done
+}
+
+# --- A private X server on a free display (Xvfb picks the number and tells us) ---
+Xvfb -displayfd 3 -screen 0 1280x900x24 -nolisten tcp 3>"$work/display" 2>"$work/xvfb.err" &
+xvfb_pid=$!
+deadline=$((SECONDS + TIMEOUT_S))
+until [ -s "$work/display" ]; do
+  if ! kill -0 "$xvfb_pid" 2>/dev/null || [ $SECONDS -ge $deadline ]; then
+    echo "SKIP: Xvfb cannot run here: $(head -c 500 "$work/xvfb.err")"
+    xvfb_pid=""
+    exit $SKIP
+  fi
+  sleep 0.1
+done
+export DISPLAY=":$(head -n1 "$work/display")"
+if ! xdotool getmouselocation >/dev/null 2>&1; then
+  echo "SKIP: xdotool cannot reach the X server"
+  exit $SKIP
+fi
+
+# --- The gallery in a window ---
+SDL_VIDEODRIVER=x11 "$gallery" --size 1100x760 --log "$work/log" --dump-tree \
+  >"$work/tree.json" 2>"$work/gallery.err" &
+gallery_pid=$!
+
+tree_done() { grep -q '^}$' "$work/tree.json" 2>/dev/null; }
+wait_for "the Glob tree" tree_done
+window_found() {
+  window="$(xdotool search --name '^globkit gallery$' 2>/dev/null | head -n1)"
+  [ -n "$window" ]
+}
+wait_for "the gallery window" window_found
+grep -q '"width": 1100, "height": 760' "$work/tree.json" || fail "window size not as asked"
+
+# The centre of the Glob whose line in the tree has `kind` and `name`, as "X Y".
+centre_of() {
+  local line
+  line="$(grep -F "\"kind\": \"$1\", \"name\": \"$2\"" "$work/tree.json" | head -n1)"
+  [ -n "$line" ] || return 1
+  echo "$line" | sed -E 's/.*"rect": \[([0-9-]+), ([0-9-]+), ([0-9]+), ([0-9]+)\].*/\1 \2 \3 \4/' |
+    awk '{ printf "%d %d\n", $1 + $3 / 2, $2 + $4 / 2 }'
+}
+
+click_on() {
+  local xy
+  xy="$(centre_of "$1" "$2")" || fail "no $1 named '$2' in the tree"
+  # shellcheck disable=SC2086
+  xdotool mousemove --window "$window" $xy click 1
+}
+
+logged() { grep -qF -- "$1" "$work/log" 2>/dev/null; }
+
+# 1. A page selector entry: the selector logs the entry's report.
+click_on pagetab "Buttons"
+wait_for "the Buttons entry's report" logged 'Gallery  pagetab "Buttons"  "PageSelected"'
+
+# 2. Back to the foundation page, then a tile on it reports to its page.
+click_on pagetab "Foundation"
+wait_for "the Foundation entry's report" logged 'pagetab "Foundation"  "PageSelected"'
+click_on tile "Queued message"
+wait_for "the tile's message" logged 'Foundation  tile "Queued message"  "queued hello"'
+
+# 3. Keys typed into the key probe arrive with the library's codes.
+click_on keyprobe "Key probe"
+sleep 0.2
+xdotool key ctrl+c Left
+xdotool type 'q'
+wait_for "Ctrl+C" logged '"key 0x22000043 Ctrl+C"'
+wait_for "Left" logged '"key 0x0800004B Left"'
+wait_for "a typed character" logged '"key 0x00000071 q"'
+
+# --- Quit as a window manager would ask; the gallery must exit cleanly ---
+kill -TERM "$gallery_pid"
+deadline=$((SECONDS + TIMEOUT_S))
+while kill -0 "$gallery_pid" 2>/dev/null; do
+  [ $SECONDS -lt $deadline ] || fail "the gallery did not quit"
+  sleep 0.1
+done
+wait "$gallery_pid"
+status=$?
+gallery_pid=""
+[ $status -eq 0 ] || fail "the gallery exited with status $status"
+
+echo "PASS: $(wc -l <"$work/log") messages logged"
+exit 0
