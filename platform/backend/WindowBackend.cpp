@@ -5,6 +5,7 @@
 
 #include "platform/glib/CairoPaintSession.h"
 #include "platform/misc/Diagnostics.h"
+#include "platform/misc/WindowsClipboard.h"
 #include "platform/os/OS.h"
 
 namespace {
@@ -72,6 +73,8 @@ bool WindowBackend::create(const String& title, int width, int height) {
   root_ = std::make_unique<RootGlob>(geometry_.rootWidth, geometry_.rootHeight);
   if (!makeSurfaces()) return false;
   cursors_ = std::make_unique<SdlCursorSet>();
+  clipboard_ = std::make_unique<SdlClipboardProvider>();
+  WindowsClipboard::setProvider(clipboard_.get());
   SDL_StartTextInput();
   OS()->keyboard().setModifiers(SdlInputTranslator::modifierBits(SDL_GetModState()));
   return true;
@@ -81,6 +84,11 @@ WindowBackend::~WindowBackend() {
   // The Globs go first: they may still reach the screen while they are deleted.
   root_.reset();
   cursors_.reset();
+  // Someone may have installed another provider since; theirs stays.
+  if (clipboard_ && &WindowsClipboard::provider() == clipboard_.get()) {
+    WindowsClipboard::setProvider(nullptr);
+  }
+  clipboard_.reset();
   releaseSurfaces();
   if (renderer_) SDL_DestroyRenderer(renderer_);
   if (window_) SDL_DestroyWindow(window_);

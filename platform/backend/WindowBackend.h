@@ -12,6 +12,7 @@
 #include <memory>
 
 #include "platform/backend/Backend.h"
+#include "platform/backend/SdlClipboardProvider.h"
 #include "platform/backend/SdlCursorSet.h"
 #include "platform/backend/SdlInputTranslator.h"
 #include "platform/glob/GlobHandle.h"
@@ -63,6 +64,7 @@ class WindowBackend : public Backend {
   std::unique_ptr<Glib::CairoPaintSession> session_;
   std::unique_ptr<RootGlob> root_;
   std::unique_ptr<SdlCursorSet> cursors_;
+  std::unique_ptr<SdlClipboardProvider> clipboard_;
   SdlInputTranslator translator_;
   WindowGeometry geometry_;
   GlobHandle<> inputFocus_;  // the Glob the input method's window is placed at
