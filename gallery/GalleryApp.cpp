@@ -52,9 +52,10 @@ void GalleryApp::selectPage(int index) {
   update(Kw::Box<int>(0, height() - kHeaderHeight, width(), height()));
 }
 
-void GalleryApp::fitToScreen() {
-  if (screen_.width() == width() && screen_.height() == height()) return;
+bool GalleryApp::fitToScreen() {
+  if (screen_.width() == width() && screen_.height() == height()) return false;
   reshape_canvas(0, 0, screen_.width(), screen_.height());
+  return true;
 }
 
 void GalleryApp::reshape() {

@@ -23,8 +23,8 @@ class GalleryApp : public Glob {
   GalleryPage* page(int index) const;
   // Shows page `index`; out-of-range numbers are refused and the current page kept.
   void selectPage(int index);
-  // Follows the screen's size; cheap when it has not changed.
-  void fitToScreen();
+  // Follows the screen's size; false (and nothing done) when it has not changed.
+  bool fitToScreen();
 
   void reshape() override;
   void draw() override;

@@ -86,7 +86,10 @@ int main(int argc, char** argv) {
   if (!options.screenshotDir.empty()) {
     status = writeScreenshots(screen, *app, options.screenshotDir);
   } else if (window) {
-    while (window->step(16)) app->fitToScreen();
+    while (window->step(16)) {
+      // A new window size: lay out and show it at once rather than a frame later.
+      if (app->fitToScreen()) window->render();
+    }
   } else if (!options.dumpTree) {
     // Headless with nothing asked: the pages as pictures are what there is to show.
     char dir[] = "/tmp/globkit-gallery-XXXXXX";
