@@ -23,9 +23,9 @@ class CairoPaintSession;
 
 class WindowBackend : public Backend {
  public:
-  // Opens a window of `width` x `height` window units. Null when there is no display or SDL
-  // cannot make the window (the reason goes through Diagnostics); callers fall back to a
-  // headless screen.
+  // Opens a window of `width` x `height` window units. Null when there is no display (and no
+  // SDL video driver named explicitly) or SDL cannot make the window (the reason goes through
+  // Diagnostics); callers fall back to a headless screen.
   static std::unique_ptr<WindowBackend> open(const String& title, int width, int height);
   ~WindowBackend() override;
   WindowBackend(const WindowBackend&) = delete;
