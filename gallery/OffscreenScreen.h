@@ -18,6 +18,8 @@ class OffscreenScreen : public Backend {
   bool screenshot(const Glob& glob, const String& pngPath) override;
 
  private:
+  bool write(const Kw::Box<int>& rootArea, const String& pngPath);
+
   std::unique_ptr<RootGlob> root_;
   cairo_surface_t* surface_;
   std::unique_ptr<Glib::CairoPaintSession> session_;
