@@ -16,20 +16,25 @@ CairoPaintSession::~CairoPaintSession() {
 void CairoPaintSession::beginFrame(const std::vector<Kw::Box<int>>& areas,
                                    const Colour& background) {
   presented_.clear();
-  cairo_save(cr_);
-  cairo_set_operator(cr_, CAIRO_OPERATOR_SOURCE);
-  cairo_set_source_rgba(cr_, background.r, background.g, background.b, background.a);
   for (const auto& a : areas) {
     // Bottom-up root box to Cairo's top-down rectangle.
-    const Kw::Box<int> top(a.x0, rootHeight_ - a.y1, a.x1, rootHeight_ - a.y0);
-    presented_.push_back(top);
-    cairo_rectangle(cr_, top.x0, top.y0, top.width(), top.height());
+    presented_.push_back(Kw::Box<int>(a.x0, rootHeight_ - a.y1, a.x1, rootHeight_ - a.y0));
   }
-  cairo_fill(cr_);
-  cairo_restore(cr_);
+  cairo_save(cr_);
+  for (const auto& top : presented_)
+    cairo_rectangle(cr_, top.x0, top.y0, top.width(), top.height());
+  // Everything drawn this frame stays inside the damaged areas.
+  cairo_clip(cr_);
+  cairo_set_operator(cr_, CAIRO_OPERATOR_SOURCE);
+  cairo_set_source_rgba(cr_, background.r, background.g, background.b, background.a);
+  cairo_paint(cr_);
+  cairo_set_operator(cr_, CAIRO_OPERATOR_OVER);
+  inFrame_ = true;
 }
 
 void CairoPaintSession::endFrame(const std::vector<Kw::Box<int>>&) {
+  if (inFrame_) cairo_restore(cr_);
+  inFrame_ = false;
   cairo_surface_flush(surface_);
 }
 

@@ -36,6 +36,7 @@ class CairoPaintSession : public PaintSession {
   cairo_t* cr_;
   int rootHeight_;
   Canvas* current_ = nullptr;
+  bool inFrame_ = false;
   std::vector<Kw::Box<int>> presented_;
 };
 

@@ -16,7 +16,8 @@ class PaintSession {
   virtual void beginFrame(const std::vector<Kw::Box<int>>& areas, const Colour& background) = 0;
   // The pass is over: the areas may be presented.
   virtual void endFrame(const std::vector<Kw::Box<int>>& areas) = 0;
-  // `clip` is the part of the root (root coordinates) that this canvas may touch now.
+  // `clip` (root coordinates) bounds the part of the canvas to repaint: its visible part that
+  // meets the frame's areas. Sessions that draw also keep the canvas within those areas.
   virtual void beginCanvas(Canvas& canvas, const Kw::Box<int>& clip) = 0;
   virtual void endCanvas(Canvas& canvas) = 0;
 };
