@@ -21,6 +21,7 @@ FontCache::FontCache()
 FontCache::~FontCache() {
   layouts_.clear();
   fonts_.clear();
+  glyphs_.clear();
   g_object_unref(context_);
   g_object_unref(fontMap_);
 }
@@ -28,7 +29,7 @@ FontCache::~FontCache() {
 Kw::Ptr<ShapedFont> FontCache::get(const FontDesc& desc) {
   const FontDesc key = desc.resolved();
   if (auto it = fonts_.find(key); it != fonts_.end()) return it->second;
-  Kw::Ptr<ShapedFont> font(new ShapedFont(key, context_, layouts_, nextId_++));
+  Kw::Ptr<ShapedFont> font(new ShapedFont(key, context_, layouts_, glyphs_, nextId_++));
   fonts_.emplace(key, font);
   return font;
 }

@@ -7,6 +7,7 @@
 #include <unordered_map>
 
 #include "platform/glib/FontDesc.h"
+#include "platform/glib/GlyphCache.h"
 #include "platform/glib/LayoutCache.h"
 #include "platform/glib/ShapedFont.h"
 
@@ -30,6 +31,7 @@ class FontCache {
  private:
   PangoFontMap* fontMap_;
   PangoContext* context_;
+  GlyphCache glyphs_;
   LayoutCache layouts_;
   std::unordered_map<FontDesc, Kw::Ptr<ShapedFont>, FontDescHash> fonts_;
   int nextId_ = 1;

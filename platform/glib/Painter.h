@@ -5,6 +5,9 @@
 // being repainted. A painter made outside a paint pass, or for a canvas that is not the one
 // being drawn, is inert: it draws nothing.
 #include <cairo.h>
+#include <pixman.h>
+
+#include <vector>
 
 #include "platform/glib/TextAlignment.h"
 #include "platform/glib/TextStyles.h"
@@ -16,8 +19,10 @@ class Canvas;
 
 namespace Glib {
 
+class CairoPaintSession;
 class iFont;
 class Image;
+class TextLayout;
 
 enum class Bevel { Raised, Sunken };
 
@@ -28,7 +33,7 @@ class Painter {
   Painter(const Painter&) = delete;
   Painter& operator=(const Painter&) = delete;
 
-  bool active() const { return cr_ != nullptr; }
+  bool active() const { return session_ != nullptr; }
   int width() const { return width_; }
   int height() const { return height_; }
   Kw::Box<int> bounds() const { return Kw::Box<int>(0, 0, width_, height_); }
@@ -47,6 +52,10 @@ class Painter {
   // first. The inside of the box is left untouched.
   void depthBox(const Kw::Box<int>& box, Bevel kind, int bevelWidth, const Colour& light,
                 const Colour& shadow);
+  // The same look with the face filled too: the rings are mixed with `face` rather than blended
+  // over it, which costs much less than blending.
+  void depthBox(const Kw::Box<int>& box, Bevel kind, int bevelWidth, const Colour& light,
+                const Colour& shadow, const Colour& face);
   // The keyboard-focus mark: a one-pixel dotted frame just inside `box`.
   void focusRect(const Kw::Box<int>& box, const Colour& c);
 
@@ -73,19 +82,37 @@ class Painter {
   void pushClip(const Kw::Box<int>& box);
   void popClip();
 
-  // The Cairo context, origin at the canvas's top-left corner, y downward; null when inert.
-  cairo_t* cairo() const { return cr_; }
+  // The Cairo context, origin at the canvas's top-left corner, y downward, clipped like the
+  // painter; null when inert. Set up on first use (plain fills and text never need it).
+  cairo_t* cairo();
   // Converts a canvas y (upward, pixel edge) to Cairo's downward y.
   double cairoY(double y) const { return height_ - y; }
 
  private:
-  void setSource(const Colour& c) const;
-  void rectPath(const Kw::Box<int>& box) const;
+  struct ClipEntry {
+    Kw::Box<int> box;  // the effective clip, canvas coordinates
+    bool inCairo;      // pushed onto the Cairo context too
+  };
 
+  void setSource(const Colour& c);
+  void rectPath(const Kw::Box<int>& box);
+  // A canvas box in image pixels.
+  pixman_box32_t device(const Kw::Box<int>& box) const;
+  void fillBoxes(const pixman_box32_t* boxes, int n, const Colour& c);
+  // The bevel rings; `face` null blends faded colours over the face already drawn.
+  void bevelRings(const Kw::Box<int>& box, Bevel kind, int w, const Colour& light,
+                  const Colour& shadow, const Colour* face);
+  // Composites shaped text whose layout box has its top-left corner at (left, top), in the
+  // canvas's top-down pixels.
+  void compositeText(const TextLayout& layout, int left, int top, const Colour& c);
+  void narrowTargetClip();
+
+  CairoPaintSession* session_ = nullptr;
   cairo_t* cr_ = nullptr;
   int width_ = 0;
   int height_ = 0;
-  int clipDepth_ = 0;
+  std::vector<ClipEntry> clips_;
+  pixman_region32_t narrowed_;
 };
 
 }  // namespace Glib

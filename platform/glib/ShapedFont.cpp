@@ -38,7 +38,8 @@ int previousWord(const WString& t, int i) {
 
 }  // namespace
 
-ShapedFont::ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts, int id)
+ShapedFont::ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts,
+                       GlyphCache& glyphs, int id)
     : iFont(desc),
       context_(static_cast<PangoContext*>(g_object_ref(context))),
       pangoDesc_(pango_font_description_new()),
@@ -50,20 +51,28 @@ ShapedFont::ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache&
                                     desc.bold() ? PANGO_WEIGHT_BOLD : PANGO_WEIGHT_NORMAL);
   pango_font_description_set_style(pangoDesc_,
                                    desc.italic() ? PANGO_STYLE_ITALIC : PANGO_STYLE_NORMAL);
+  info_.context = context_;
+  info_.desc = pangoDesc_;
   // The line box of an empty layout is the font's own line box.
-  TextLayout empty(context_, pangoDesc_, WString());
+  TextLayout empty(info_, WString());
   height_ = empty.height();
   ascent_ = empty.baseline();
+  info_.lineHeight = height_;
+  info_.baseline = ascent_;
+  info_.primary = pango_context_load_font(context_, pangoDesc_);
+  coverage_.assign(TextLayout::kCoverageLimit, 0);
+  info_.coverage = &coverage_;
+  info_.glyphs = &glyphs;
 }
 
 ShapedFont::~ShapedFont() {
+  if (info_.primary) g_object_unref(info_.primary);
   pango_font_description_free(pangoDesc_);
   g_object_unref(context_);
 }
 
 Kw::Ptr<TextLayout> ShapedFont::layout(const WString& text) const {
-  return layouts_.get(
-      id_, text, [&] { return Kw::Ptr<TextLayout>(new TextLayout(context_, pangoDesc_, text)); });
+  return layouts_.get(id_, text, [&] { return Kw::Ptr<TextLayout>(new TextLayout(info_, text)); });
 }
 
 int ShapedFont::textWidth(const WString& text) const {

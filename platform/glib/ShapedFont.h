@@ -2,17 +2,21 @@
 // The font service's font: Pango shapes its text, the layout cache keeps the results.
 #include <pango/pango.h>
 
+#include <vector>
+
 #include "platform/glib/TextLayout.h"
 #include "platform/glib/iFont.h"
 
 namespace Glib {
 
+class GlyphCache;
 class LayoutCache;
 
 class ShapedFont : public iFont {
  public:
   // `desc` is resolved (face and size filled in). The font keeps a reference on `context`.
-  ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts, int id);
+  ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts, GlyphCache& glyphs,
+             int id);
   ~ShapedFont() override;
   ShapedFont(const ShapedFont&) = delete;
   ShapedFont& operator=(const ShapedFont&) = delete;
@@ -30,6 +34,8 @@ class ShapedFont : public iFont {
  private:
   PangoContext* context_;
   PangoFontDescription* pangoDesc_;
+  TextLayout::FontInfo info_;
+  std::vector<uint8_t> coverage_;
   LayoutCache& layouts_;
   int id_;
   int height_ = 0;

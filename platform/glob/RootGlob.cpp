@@ -274,7 +274,7 @@ bool RootGlob::paint(PaintSession& session) {
   if (!Drawable::redrawsEnabled() || dirty_.empty()) return false;
   const std::vector<Kw::Box<int>> areas = dirty_.take();
   painting_ = &session;
-  session.beginFrame(areas, getPalette().get(Palette::Window));
+  session.beginFrame(areas);
   paintTree(session, canvas(), canvas()->rootRect(), areas);
   session.endFrame(areas);
   painting_ = nullptr;
@@ -291,15 +291,26 @@ void RootGlob::paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& parentV
   Kw::Box<int> damaged;
   for (const auto& a : areas) damaged = damaged.united(a.intersection(visible));
   if (damaged.empty()) return;
+  const XY<int> o = c->rootOrigin();
+  std::vector<Canvas*> kids;
+  c->childrenIn(damaged.translated(-o.x, -o.y), kids);
+  // What opaque children will paint anyway is left out of this canvas's clip.
+  std::vector<Kw::Box<int>> covered;
+  for (Canvas* k : kids) {
+    if (!k->isOpaque() || !k->isMapped()) continue;
+    const Kw::Box<int> r = k->rect().translated(o.x, o.y).intersection(damaged);
+    if (!r.empty()) covered.push_back(r);
+  }
   Glob* g = globOf(c);
-  if (g && g != this) {
-    s.beginCanvas(*c, damaged);
+  if (g == this) {
+    s.beginCanvas(*c, damaged, covered);
+    s.fillCanvas(getPalette().get(Palette::Window));
+    s.endCanvas(*c);
+  } else if (g) {
+    s.beginCanvas(*c, damaged, covered);
     g->draw();
     s.endCanvas(*c);
     if (drawObserver_) drawObserver_(g);
   }
-  const XY<int> o = c->rootOrigin();
-  std::vector<Canvas*> kids;
-  c->childrenIn(damaged.translated(-o.x, -o.y), kids);
   for (Canvas* k : kids) paintTree(s, k, visible, areas);
 }

@@ -12,10 +12,11 @@ namespace {
 // A repaint pass that produces no pixels; it only lets the root walk what it would draw.
 class NullPaintSession : public PaintSession {
  public:
-  void beginFrame(const std::vector<Kw::Box<int>>&, const Colour&) override {}
+  void beginFrame(const std::vector<Kw::Box<int>>&) override {}
   void endFrame(const std::vector<Kw::Box<int>>&) override {}
-  void beginCanvas(Canvas&, const Kw::Box<int>&) override {}
+  void beginCanvas(Canvas&, const Kw::Box<int>&, const std::vector<Kw::Box<int>>&) override {}
   void endCanvas(Canvas&) override {}
+  void fillCanvas(const Colour&) override {}
 };
 
 }  // namespace
