@@ -238,8 +238,16 @@ void Painter::image(const Image& img, XY<int> at, double opacity) {
 }
 
 void Painter::compositeText(const TextLayout& layout, int left, int top, const Colour& c) {
+  if (!(c.a > 0)) return;
+  if (!layout.hasMask()) {
+    // Too large to keep as a picture: glyph by glyph, Cairo dropping what the clip hides.
+    cairo_t* cr = cairo();
+    setSource(c);
+    layout.draw(cr, left, top);
+    return;
+  }
   const TextLayout::Mask& m = layout.mask();
-  if (!m.image || !(c.a > 0)) return;
+  if (!m.image) return;
   const XY<int> o = session_->origin();
   pixman_image_composite32(PIXMAN_OP_OVER, session_->solid(premultiplied(c)), m.image,
                            session_->target(), 0, 0, 0, 0, o.x + left + m.x, o.y + top + m.y,

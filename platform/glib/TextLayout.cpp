@@ -188,6 +188,11 @@ TextLayout::~TextLayout() {
   for (Run& r : runs_) cairo_scaled_font_destroy(r.font);
 }
 
+bool TextLayout::hasMask() const {
+  mask();
+  return mask_.image != nullptr || (ink_.empty() && missing_.empty());
+}
+
 const TextLayout::Mask& TextLayout::mask() const {
   if (maskMade_) return mask_;
   maskMade_ = true;
@@ -196,7 +201,13 @@ const TextLayout::Mask& TextLayout::mask() const {
   if (!missing_.empty()) area = area.united(Kw::Box<int>(0, 0, width_, height_));
   if (area.empty()) return mask_;
   area = Kw::Box<int>(area.x0 - 1, area.y0 - 1, area.x1 + 1, area.y1 + 1);
+  if (area.width() > kMaxMaskWidth || area.height() > kMaxMaskWidth) return mask_;
   maskSurface_ = cairo_image_surface_create(CAIRO_FORMAT_A8, area.width(), area.height());
+  if (cairo_surface_status(maskSurface_) != CAIRO_STATUS_SUCCESS) {
+    cairo_surface_destroy(maskSurface_);
+    maskSurface_ = nullptr;
+    return mask_;
+  }
   if (glyphCache_ && missing_.empty()) {
     unsigned char* data = cairo_image_surface_get_data(maskSurface_);
     const int stride = cairo_image_surface_get_stride(maskSurface_);

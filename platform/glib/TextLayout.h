@@ -57,7 +57,8 @@ class TextLayout : public Kw::RefCounted {
 
   // The text's coverage as an 8-bit mask, made on first use and kept: compositing it is one
   // operation however many glyphs the text has. (x, y) is the mask's top-left corner relative
-  // to the layout's; the image is null for text that shows nothing.
+  // to the layout's; the image is null for text that shows nothing and for text too large to
+  // keep as a picture (see hasMask).
   struct Mask {
     pixman_image_t* image = nullptr;
     int x = 0;
@@ -66,6 +67,9 @@ class TextLayout : public Kw::RefCounted {
     int height = 0;
   };
   const Mask& mask() const;
+  // False when the text is drawn glyph by glyph instead (wider than kMaxMaskWidth).
+  bool hasMask() const;
+  static constexpr int kMaxMaskWidth = 4096;
 
   // The text as it is shaped: one character per input character, unprintable ones replaced.
   static WString displayText(const WString& text);
