@@ -142,6 +142,23 @@ TEST(GlibPainter, DepthBoxesLightFromTheTopLeft) {
   EXPECT_EQ(h.pixelAt(60, 15), Harness::argb(kGrey));
 }
 
+TEST(GlibPainter, FocusRectIsADottedFrameInside) {
+  Harness h(30, 20);
+  PaintGlob g(h.place(0, 0, 30, 20), [](Glib::Painter& p) {
+    p.fillRect(p.bounds(), kGrey);
+    p.focusRect(Kw::Box<int>(4, 4, 24, 14), kWhite);
+  });
+  h.render();
+  EXPECT_EQ(inkIn(h, Kw::Box<int>(0, 0, 30, 20), kGrey), Kw::Box<int>(4, 4, 24, 14));
+  // Every other pixel along the top edge, crisp (the right edge's dots start in the corner).
+  for (int x = 4; x < 23; ++x) {
+    EXPECT_EQ(h.pixelAt(x, 13), Harness::argb((x - 4) % 2 == 0 ? kWhite : kGrey)) << x;
+  }
+  EXPECT_EQ(h.pixelAt(4, 12), Harness::argb(kGrey));
+  EXPECT_EQ(h.pixelAt(4, 11), Harness::argb(kWhite));
+  EXPECT_EQ(h.pixelAt(10, 10), Harness::argb(kGrey)) << "the inside is left alone";
+}
+
 TEST(GlibPainter, DepthBoxOnTinyOrEmptyBoxesStaysInside) {
   Harness h(20, 20);
   PaintGlob g(h.place(0, 0, 20, 20), [&](Glib::Painter& p) {
