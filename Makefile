@@ -35,6 +35,7 @@ test-plain: $(BUILD)/build.ninja
 test-asan: $(ASAN_BUILD)/build.ninja
 	cmake --build $(ASAN_BUILD) -j $(JOBS)
 	cd $(ASAN_BUILD) && ASAN_OPTIONS=detect_leaks=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
+	  LSAN_OPTIONS=suppressions=$(CURDIR)/tools/lsan-suppressions.txt \
 	  ctest --output-on-failure -j $(JOBS)
 
 bench: bootstrap $(BENCH_BUILD)/build.ninja

@@ -4,6 +4,8 @@
 #include <cstdlib>
 #include <filesystem>
 
+#include <unistd.h>
+
 #include "platform/testing/GoldenImage.h"
 #include "platform/testing/Harness.h"
 #include "tests/glib/PaintGlob.h"
@@ -14,7 +16,10 @@ namespace {
 class Goldens : public ::testing::Test {
  protected:
   void SetUp() override {
-    root_ = std::filesystem::temp_directory_path() / "globkit-golden-test";
+    // Tests may run in parallel processes: each gets its own tree.
+    root_ = std::filesystem::temp_directory_path() /
+            ("globkit-golden-" + std::to_string(getpid()) + "-" +
+             ::testing::UnitTest::GetInstance()->current_test_info()->name());
     std::filesystem::remove_all(root_);
     std::filesystem::create_directories(root_ / "src/tests/golden");
     keep("GLOBKIT_SOURCE_DIR", (root_ / "src").string());

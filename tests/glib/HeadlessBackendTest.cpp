@@ -5,6 +5,8 @@
 
 #include <filesystem>
 
+#include <unistd.h>
+
 #include "platform/backend/HeadlessBackend.h"
 #include "platform/misc/Diagnostics.h"
 #include "platform/testing/MessageProbe.h"
@@ -17,7 +19,10 @@ const Colour kRed = Colour::fromHex(0xC02020);
 class Screenshots : public ::testing::Test {
  protected:
   void SetUp() override {
-    dir_ = std::filesystem::temp_directory_path() / "globkit-headless-test";
+    // Tests may run in parallel processes: each gets its own directory.
+    dir_ = std::filesystem::temp_directory_path() /
+           ("globkit-headless-" + std::to_string(getpid()) + "-" +
+            ::testing::UnitTest::GetInstance()->current_test_info()->name());
     std::filesystem::create_directories(dir_);
   }
   void TearDown() override { std::filesystem::remove_all(dir_); }

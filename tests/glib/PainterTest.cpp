@@ -7,6 +7,8 @@
 #include <cstdlib>
 #include <filesystem>
 
+#include <unistd.h>
+
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Image.h"
 #include "platform/glib/ImageCache.h"
@@ -296,7 +298,8 @@ TEST(GlibImages, MissingFileGivesAPlaceholderReportedOnce) {
 }
 
 TEST(GlibImages, PngTransparencyBlendsOverTheCanvas) {
-  const auto dir = std::filesystem::temp_directory_path() / "globkit-glib-images";
+  const auto dir =
+      std::filesystem::temp_directory_path() / ("globkit-images-" + std::to_string(getpid()));
   std::filesystem::create_directories(dir);
   const String path = (dir / "half.png").string();
   {
