@@ -43,6 +43,12 @@ class Canvas {
   bool isMapped() const { return mapped_; }
   bool isMappedToRoot() const;
 
+  // An opaque canvas promises that its client's draw() covers every pixel of it with opaque
+  // paint. Repaints then skip what lies beneath it (its parent's background, the screen's
+  // clear). Off by default.
+  void setOpaque(bool opaque) { opaque_ = opaque; }
+  bool isOpaque() const { return opaque_; }
+
   // Stacking among siblings.
   void raise();
   void lower();
@@ -79,6 +85,7 @@ class Canvas {
   CanvasHost* host_ = nullptr;
   Kw::Box<int> rect_;
   bool mapped_ = true;
+  bool opaque_ = false;
   std::vector<Canvas*> children_;
   mutable ChildIndex index_;
   mutable bool indexDirty_ = true;

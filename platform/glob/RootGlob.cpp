@@ -274,26 +274,43 @@ bool RootGlob::paint(PaintSession& session) {
   if (!Drawable::redrawsEnabled() || dirty_.empty()) return false;
   const std::vector<Kw::Box<int>> areas = dirty_.take();
   painting_ = &session;
-  session.beginFrame(areas, getPalette().get(Palette::Window));
-  for (const auto& area : areas) paintTree(session, canvas(), area);
+  session.beginFrame(areas);
+  paintTree(session, canvas(), canvas()->rootRect(), areas);
   session.endFrame(areas);
   painting_ = nullptr;
   return true;
 }
 
-void RootGlob::paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& clip) {
+void RootGlob::paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& parentVisible,
+                         const std::vector<Kw::Box<int>>& areas) {
   if (!c->isMapped()) return;
-  const Kw::Box<int> visible = c->rootRect().intersection(clip);
+  const Kw::Box<int> visible = c->rootRect().intersection(parentVisible);
   if (visible.empty()) return;
+  // Each canvas draws once per frame, clipped to the bounding box of its damaged parts; the
+  // session's frame clip keeps it within the damaged areas themselves.
+  Kw::Box<int> damaged;
+  for (const auto& a : areas) damaged = damaged.united(a.intersection(visible));
+  if (damaged.empty()) return;
+  const XY<int> o = c->rootOrigin();
+  std::vector<Canvas*> kids;
+  c->childrenIn(damaged.translated(-o.x, -o.y), kids);
+  // What opaque children will paint anyway is left out of this canvas's clip.
+  std::vector<Kw::Box<int>> covered;
+  for (Canvas* k : kids) {
+    if (!k->isOpaque() || !k->isMapped()) continue;
+    const Kw::Box<int> r = k->rect().translated(o.x, o.y).intersection(damaged);
+    if (!r.empty()) covered.push_back(r);
+  }
   Glob* g = globOf(c);
-  if (g && g != this) {
-    s.beginCanvas(*c, visible);
+  if (g == this) {
+    s.beginCanvas(*c, damaged, covered);
+    s.fillCanvas(getPalette().get(Palette::Window));
+    s.endCanvas(*c);
+  } else if (g) {
+    s.beginCanvas(*c, damaged, covered);
     g->draw();
     s.endCanvas(*c);
     if (drawObserver_) drawObserver_(g);
   }
-  const XY<int> o = c->rootOrigin();
-  std::vector<Canvas*> kids;
-  c->childrenIn(visible.translated(-o.x, -o.y), kids);
-  for (Canvas* k : kids) paintTree(s, k, visible);
+  for (Canvas* k : kids) paintTree(s, k, visible, areas);
 }

@@ -63,8 +63,9 @@ class RootGlob : public Glob, public CanvasHost {
   // --- Painting ---
   bool needsPaint() const { return !dirty_.empty(); }
   const DirtyRegion& dirty() const { return dirty_; }
-  // Repaints what is damaged; false when nothing was painted (nothing damaged, or redraws
-  // held back by disableRedraws/refresh_off).
+  // Repaints what is damaged, in stacking order, each mapped canvas with a visible damaged
+  // part drawn once; false when nothing was painted (nothing damaged, or redraws held back by
+  // disableRedraws/refresh_off).
   bool paint(PaintSession& session);
   // Called for each Glob asked to draw during paint().
   void setDrawObserver(std::function<void(Glob*)> observer) { drawObserver_ = std::move(observer); }
@@ -84,7 +85,8 @@ class RootGlob : public Glob, public CanvasHost {
  private:
   void updateHover(Glob* under);
   int dragTypeFor(int moveType) const;
-  void paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& clip);
+  void paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& parentVisible,
+                 const std::vector<Kw::Box<int>>& areas);
   static bool isInside(const Canvas* c, const Canvas* ancestor);
 
   std::deque<Event> queue_;

@@ -1,7 +1,9 @@
 #include "platform/testing/Harness.h"
 
 #include <algorithm>
+#include <cmath>
 
+#include "platform/backend/RootRenderer.h"
 #include "platform/glob/RuntimeClock.h"
 #include "platform/os/OS.h"
 
@@ -10,10 +12,11 @@ namespace {
 // A repaint pass that produces no pixels; it only lets the root walk what it would draw.
 class NullPaintSession : public PaintSession {
  public:
-  void beginFrame(const std::vector<Kw::Box<int>>&, const Colour&) override {}
+  void beginFrame(const std::vector<Kw::Box<int>>&) override {}
   void endFrame(const std::vector<Kw::Box<int>>&) override {}
-  void beginCanvas(Canvas&, const Kw::Box<int>&) override {}
+  void beginCanvas(Canvas&, const Kw::Box<int>&, const std::vector<Kw::Box<int>>&) override {}
   void endCanvas(Canvas&) override {}
+  void fillCanvas(const Colour&) override {}
 };
 
 }  // namespace
@@ -26,6 +29,7 @@ Harness::Harness(int width, int height) {
 }
 
 Harness::~Harness() {
+  renderer_.reset();
   root_.reset();
   OS()->keyboard().setModifiers(0);
   RuntimeClock::setManual(false);
@@ -103,10 +107,35 @@ int64_t Harness::now() {
 }
 
 std::vector<Glob*> Harness::paint() {
+  if (renderer_) return render();
   drawn_.clear();
   NullPaintSession session;
   root_->paint(session);
   return drawn_;
+}
+
+RootRenderer& Harness::renderer() {
+  if (!renderer_) renderer_ = std::make_unique<RootRenderer>(*root_);
+  return *renderer_;
+}
+
+std::vector<Glob*> Harness::render() {
+  RootRenderer& r = renderer();
+  drawn_.clear();
+  r.render();
+  return drawn_;
+}
+
+uint32_t Harness::pixelAt(int x, int y) const {
+  return renderer_ ? renderer_->pixelAt(XY<int>(x, y)) : 0;
+}
+
+uint32_t Harness::argb(const Colour& c) {
+  auto byte = [](double v) {
+    return static_cast<uint32_t>(std::lround(std::clamp(v, 0.0, 1.0) * 255.0));
+  };
+  const double a = std::clamp(c.a, 0.0, 1.0);
+  return byte(a) << 24 | byte(c.r * a) << 16 | byte(c.g * a) << 8 | byte(c.b * a);
 }
 
 bool Harness::drew(const Glob* g) const {

@@ -2,10 +2,13 @@
 // The headless test harness: a screen of a given size on a manual clock, with pointer and key
 // injection in root coordinates (bottom-left origin, y upward), modifier state, time that
 // fires ticks as it passes, queue pumping, and a record of which Globs drew.
+#include <cstdint>
 #include <memory>
 #include <vector>
 
 #include "platform/glob/RootGlob.h"
+
+class RootRenderer;
 
 enum class MouseButton { Left = 0x20, Right = 0x40, Middle = 0x10, Chord = 0x80 };
 
@@ -49,8 +52,19 @@ class Harness {
   static int64_t now();
 
   // --- Painting ---
-  // Runs a repaint pass with no pixels and returns the Globs asked to draw, in order.
+  // Runs a repaint pass and returns the Globs asked to draw, in order. Until render() is first
+  // called the pass produces no pixels; from then on it paints into the harness's image.
   std::vector<Glob*> paint();
+  // Repaints into a real image the size of the root (made on first use, when everything is
+  // painted) and returns the Globs asked to draw, in order.
+  std::vector<Glob*> render();
+  // A pixel of the image as of the last render, at a root position (bottom-up), as
+  // 0xAARRGGBB; 0 outside the root or before the first render.
+  uint32_t pixelAt(int x, int y) const;
+  // The image, made on first use.
+  RootRenderer& renderer();
+  // A colour as pixelAt reports it when painted opaquely.
+  static uint32_t argb(const Colour& c);
   bool drew(const Glob* g) const;
   const std::vector<Glob*>& lastDrawn() const { return drawn_; }
 
@@ -58,6 +72,7 @@ class Harness {
   unsigned withModifiers(unsigned code) const;
 
   std::unique_ptr<RootGlob> root_;
+  std::unique_ptr<RootRenderer> renderer_;
   std::vector<Glob*> drawn_;
   unsigned modifiers_ = 0;
 };

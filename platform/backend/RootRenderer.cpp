@@ -1,0 +1,74 @@
+#include "platform/backend/RootRenderer.h"
+
+#include <algorithm>
+
+#include "platform/misc/Diagnostics.h"
+
+RootRenderer::RootRenderer(RootGlob& root) : root_(root) {
+  makeSurface(root.canvas()->width(), root.canvas()->height());
+}
+
+RootRenderer::~RootRenderer() {
+  session_.reset();
+  cairo_surface_destroy(surface_);
+}
+
+void RootRenderer::makeSurface(int width, int height) {
+  session_.reset();
+  if (surface_) cairo_surface_destroy(surface_);
+  surface_ =
+      cairo_image_surface_create(CAIRO_FORMAT_ARGB32, std::max(1, width), std::max(1, height));
+  session_ = std::make_unique<Glib::CairoPaintSession>(surface_);
+  // A new image holds nothing yet: all of it must be painted.
+  root_.canvas()->damage();
+}
+
+bool RootRenderer::render() {
+  const Canvas* c = root_.canvas();
+  if (c->width() != width() || c->height() != height()) makeSurface(c->width(), c->height());
+  if (!root_.paint(*session_)) return false;
+  for (const auto& a : session_->presentedAreas()) changed_ = changed_.united(a);
+  return true;
+}
+
+Kw::Box<int> RootRenderer::takeChanged() {
+  const Kw::Box<int> out = changed_;
+  changed_ = Kw::Box<int>();
+  return out;
+}
+
+uint32_t RootRenderer::pixelAt(XY<int> p) const {
+  if (p.x < 0 || p.y < 0 || p.x >= width() || p.y >= height()) return 0;
+  const unsigned char* data = cairo_image_surface_get_data(surface_);
+  const int stride = cairo_image_surface_get_stride(surface_);
+  const int row = height() - 1 - p.y;
+  return reinterpret_cast<const uint32_t*>(data + row * stride)[p.x];
+}
+
+cairo_surface_t* RootRenderer::copyArea(const Kw::Box<int>& rootArea) const {
+  const Kw::Box<int> a = rootArea.intersection(Kw::Box<int>(0, 0, width(), height()));
+  if (a.empty()) return nullptr;
+  cairo_surface_t* out = cairo_image_surface_create(CAIRO_FORMAT_ARGB32, a.width(), a.height());
+  cairo_t* cr = cairo_create(out);
+  cairo_set_operator(cr, CAIRO_OPERATOR_SOURCE);
+  cairo_set_source_surface(cr, surface_, -a.x0, -(height() - a.y1));
+  cairo_paint(cr);
+  cairo_destroy(cr);
+  cairo_surface_flush(out);
+  return out;
+}
+
+bool RootRenderer::writePng(const String& path, const Kw::Box<int>& rootArea) const {
+  cairo_surface_t* area = copyArea(rootArea);
+  if (!area) {
+    diagWarning("screenshot: nothing of the requested area is on screen: " + path + "\n");
+    return false;
+  }
+  const cairo_status_t st = cairo_surface_write_to_png(area, path.c_str());
+  cairo_surface_destroy(area);
+  if (st != CAIRO_STATUS_SUCCESS) {
+    diagWarning("screenshot: cannot write " + path + ": " + cairo_status_to_string(st) + "\n");
+    return false;
+  }
+  return true;
+}

@@ -1,0 +1,124 @@
+#include "platform/glib/ShapedFont.h"
+
+#include <algorithm>
+#include <cwctype>
+
+#include "platform/glib/LayoutCache.h"
+
+namespace Glib {
+
+namespace {
+
+enum class CharClass { Space, Word, Other };
+
+CharClass classOf(wchar_t c) {
+  if (std::iswspace(static_cast<wint_t>(c))) return CharClass::Space;
+  if (std::iswalnum(static_cast<wint_t>(c)) || c == L'_') return CharClass::Word;
+  return CharClass::Other;
+}
+
+int nextWord(const WString& t, int i) {
+  const int n = static_cast<int>(t.size());
+  if (i >= n) return n;
+  const CharClass start = classOf(t[static_cast<size_t>(i)]);
+  if (start != CharClass::Space) {
+    while (i < n && classOf(t[static_cast<size_t>(i)]) == start) ++i;
+  }
+  while (i < n && classOf(t[static_cast<size_t>(i)]) == CharClass::Space) ++i;
+  return i;
+}
+
+int previousWord(const WString& t, int i) {
+  while (i > 0 && classOf(t[static_cast<size_t>(i - 1)]) == CharClass::Space) --i;
+  if (i == 0) return 0;
+  const CharClass word = classOf(t[static_cast<size_t>(i - 1)]);
+  while (i > 0 && classOf(t[static_cast<size_t>(i - 1)]) == word) --i;
+  return i;
+}
+
+}  // namespace
+
+ShapedFont::ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts,
+                       GlyphCache& glyphs, int id)
+    : iFont(desc),
+      context_(static_cast<PangoContext*>(g_object_ref(context))),
+      pangoDesc_(pango_font_description_new()),
+      layouts_(layouts),
+      id_(id) {
+  pango_font_description_set_family(pangoDesc_, desc.face.c_str());
+  pango_font_description_set_absolute_size(pangoDesc_, desc.size * double(PANGO_SCALE));
+  pango_font_description_set_weight(pangoDesc_,
+                                    desc.bold() ? PANGO_WEIGHT_BOLD : PANGO_WEIGHT_NORMAL);
+  pango_font_description_set_style(pangoDesc_,
+                                   desc.italic() ? PANGO_STYLE_ITALIC : PANGO_STYLE_NORMAL);
+  info_.context = context_;
+  info_.desc = pangoDesc_;
+  // The line box of an empty layout is the font's own line box.
+  TextLayout empty(info_, WString());
+  height_ = empty.height();
+  ascent_ = empty.baseline();
+  info_.lineHeight = height_;
+  info_.baseline = ascent_;
+  info_.primary = pango_context_load_font(context_, pangoDesc_);
+  coverage_.assign(TextLayout::kCoverageLimit, 0);
+  info_.coverage = &coverage_;
+  info_.glyphs = &glyphs;
+}
+
+ShapedFont::~ShapedFont() {
+  if (info_.primary) g_object_unref(info_.primary);
+  pango_font_description_free(pangoDesc_);
+  g_object_unref(context_);
+}
+
+Kw::Ptr<TextLayout> ShapedFont::layout(const WString& text) const {
+  return layouts_.get(id_, text, [&] { return Kw::Ptr<TextLayout>(new TextLayout(info_, text)); });
+}
+
+int ShapedFont::textWidth(const WString& text) const {
+  if (text.empty()) return 0;
+  return layout(text)->width();
+}
+
+iFont::CharacterLocation ShapedFont::charSeek(const WString& text, int fromIndex,
+                                              eCharSeekMethod method, int toIndex) const {
+  const int n = static_cast<int>(text.size());
+  const int from = std::clamp(fromIndex, 0, n);
+  int to = from;
+  switch (method) {
+    case PrevChar:
+      to = std::max(0, from - 1);
+      break;
+    case NextChar:
+      to = std::min(n, from + 1);
+      break;
+    case NextWord:
+      to = nextWord(text, from);
+      break;
+    case PrevWord:
+      to = previousWord(text, from);
+      break;
+    case Start:
+      to = 0;
+      break;
+    case End:
+      to = n;
+      break;
+    case ToIndex:
+      to = std::clamp(toIndex, 0, n);
+      break;
+    default:
+      break;  // an unknown method leaves the caret where it is
+  }
+  if (to == 0) return {0, 0};
+  return {to, layout(text)->caretX(to)};
+}
+
+iFont::CharacterLocation ShapedFont::locate(const WString& text, int x) const {
+  if (text.empty()) return {0, 0};
+  const Kw::Ptr<TextLayout> l = layout(text);
+  const int index = l->nearestIndex(x);
+  return {index, l->caretX(index)};
+}
+
+}  // namespace Glib
