@@ -4,6 +4,9 @@ BUILD ?= build
 ASAN_BUILD ?= build-asan
 BENCH_BUILD ?= build-bench
 CMAKE_FLAGS = -G Ninja -Wno-dev
+# Let ccache share results between clones of the repository in other directories.
+export CCACHE_BASEDIR := $(CURDIR)
+export CCACHE_NOHASHDIR := 1
 
 .PHONY: all bootstrap dev test test-plain test-asan bench demo format clean
 
