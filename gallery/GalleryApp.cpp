@@ -2,12 +2,10 @@
 
 #include <algorithm>
 
+#include "gallery/GalleryLook.h"
 #include "gallery/GalleryPages.h"
-#include "gallery/GalleryStyle.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/misc/Diagnostics.h"
-
-using namespace GalleryStyle;
 
 GalleryApp::GalleryApp(Glob& screen, MessageLog& log)
     : Glob(GlobCreationInfo(screen.width(), screen.height(), screen.canvas())),
@@ -83,24 +81,28 @@ String GalleryApp::describeValue() const {
 }
 
 void GalleryApp::draw() {
-  ChromePainter p(*canvas());
+  Glib::Painter p(*canvas());
   if (!p.active()) return;
+  const GalleryLook look(getPalette());
+  using F = GalleryLook::Font;
   const int w = width(), h = height();
-  p.fillRect(p.bounds(), kBackdrop);
+  p.fillRect(p.bounds(), look.backdrop());
   const Kw::Box<int> head(0, h - kHeaderHeight, w, h);
-  p.verticalGradient(head, kHeaderBottom, kHeaderTop);
-  p.hline(0, w, head.y0, kLine);
+  look.strip(p, head);
   // The mark: three stacked bars in the accent colour.
   for (int i = 0; i < 3; ++i) {
     const int y = head.y0 + 17 + i * 8;
-    p.roundedRect(Kw::Box<int>(22, y, 22 + 22 - i * 5, y + 5), 2, i == 1 ? kAccentSoft : kAccent);
+    const Colour bar = i == 1 ? look.role(Palette::Focus) : look.accent();
+    p.fillRect(Kw::Box<int>(22, y, 22 + 22 - i * 5, y + 5), bar);
   }
-  p.text("globkit", Kw::Box<int>(56, head.y0 + 8, 150, head.y1 - 8), kTitleFont, kTextStrong);
-  p.text("Widget gallery", Kw::Box<int>(142, head.y0 + 8, 330, head.y1 - 8), kBodyFont, kTextDim);
+  look.label(p, "globkit", Kw::Box<int>(56, head.y0 + 8, 150, head.y1 - 8), F::Title,
+             look.strongText());
+  look.label(p, "Widget gallery", Kw::Box<int>(142, head.y0 + 8, 330, head.y1 - 8), F::Body,
+             look.dimText());
   if (const GalleryPage* cur = page(current_)) {
     const String where = cur->title() + "   \xC2\xB7   page " + std::to_string(current_ + 1) +
                          " of " + std::to_string(pageCount());
-    p.text(where, Kw::Box<int>(w - 420, head.y0 + 8, w - 24, head.y1 - 8), kBodyFont, kText,
-           ChromeAlign::Right);
+    look.label(p, where, Kw::Box<int>(w - 420, head.y0 + 8, w - 24, head.y1 - 8), F::Body,
+               look.text(), TextAlignment::Right);
   }
 }

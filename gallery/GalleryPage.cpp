@@ -1,8 +1,6 @@
 #include "gallery/GalleryPage.h"
 
-#include "gallery/GalleryStyle.h"
-
-using namespace GalleryStyle;
+#include "gallery/GalleryLook.h"
 
 GalleryPage::GalleryPage(Canvas* parent, const String& title, const String& summary,
                          MessageLog& log)
@@ -39,34 +37,38 @@ int GalleryPage::react(Event* e) {
 }
 
 void GalleryPage::draw() {
-  ChromePainter p(*canvas());
+  Glib::Painter p(*canvas());
   if (!p.active()) return;
+  const GalleryLook look(getPalette());
+  using F = GalleryLook::Font;
   const int h = height();
-  p.text(title_, Kw::Box<int>(0, h - 34, kWidth, h), kPageTitleFont, kTextStrong);
-  p.text(summary_, Kw::Box<int>(0, h - 60, kWidth, h - 38), kBodyFont, kTextDim);
-  p.hline(0, kWidth, h - 72, kCardEdge);
+  look.label(p, title_, Kw::Box<int>(0, h - 34, kWidth, h), F::PageTitle, look.strongText());
+  look.label(p, summary_, Kw::Box<int>(0, h - 60, kWidth, h - 38), F::Body, look.dimText());
+  p.fillRect(Kw::Box<int>(0, h - 73, kWidth, h - 72), look.line());
+  p.fillRect(Kw::Box<int>(0, h - 74, kWidth, h - 73), look.hover());
   for (const Card& c : cards_) {
-    p.roundedRect(c.box, 5, kCard);
-    p.roundedOutline(c.box, 5, kCardEdge);
-    p.text(c.title, Kw::Box<int>(c.box.x0 + 16, c.box.y1 - 30, c.box.x1 - 16, c.box.y1 - 8),
-           kCaptionFont, kTextDim);
+    look.card(p, c.box, look.role(Palette::Window));
+    look.label(p, c.title, Kw::Box<int>(c.box.x0 + 16, c.box.y1 - 30, c.box.x1 - 16, c.box.y1 - 8),
+               F::Caption, look.dimText());
   }
-  if (planned_) drawPlanned(p);
+  if (planned_) drawPlanned(p, look);
 }
 
-void GalleryPage::drawPlanned(ChromePainter& p) {
+void GalleryPage::drawPlanned(Glib::Painter& p, const GalleryLook& look) {
+  using F = GalleryLook::Font;
   const Kw::Box<int> card = boxFromTop(0, kContentTop, 620, 96 + 26 * int(plannedControls_.size()));
-  p.roundedRect(card, 5, kCardInset);
-  p.roundedOutline(card, 5, kCardEdge);
-  p.fillRect(Kw::Box<int>(card.x0, card.y0 + 6, card.x0 + 3, card.y1 - 6), kPlanned);
-  p.text("NOT BUILT YET", Kw::Box<int>(card.x0 + 24, card.y1 - 36, card.x1 - 24, card.y1 - 14),
-         kCaptionFont, kTextFaint);
-  p.text("These controls arrive with " + arrivesWith_ + ".",
-         Kw::Box<int>(card.x0 + 24, card.y1 - 62, card.x1 - 24, card.y1 - 40), kBodyBold, kText);
+  look.well(p, card, look.hover());
+  p.fillRect(Kw::Box<int>(card.x0 + 1, card.y0 + 6, card.x0 + 4, card.y1 - 6), look.planned());
+  look.label(p, "NOT BUILT YET",
+             Kw::Box<int>(card.x0 + 24, card.y1 - 36, card.x1 - 24, card.y1 - 14), F::Caption,
+             look.faintText());
+  look.label(p, "These controls arrive with " + arrivesWith_ + ".",
+             Kw::Box<int>(card.x0 + 24, card.y1 - 62, card.x1 - 24, card.y1 - 40), F::Bold,
+             look.text());
   int y = card.y1 - 92;
   for (const String& c : plannedControls_) {
-    p.dot(XY<int>(card.x0 + 30, y + 10), 2.5, kPlanned);
-    p.text(c, Kw::Box<int>(card.x0 + 42, y, card.x1 - 24, y + 20), kBodyFont, kTextDim);
+    p.fillRect(Kw::Box<int>(card.x0 + 28, y + 8, card.x0 + 33, y + 13), look.planned());
+    look.label(p, c, Kw::Box<int>(card.x0 + 42, y, card.x1 - 24, y + 20), F::Body, look.dimText());
     y -= 26;
   }
 }

@@ -7,6 +7,11 @@
 #include "gallery/MessageLog.h"
 #include "platform/glob/Glob.h"
 
+class GalleryLook;
+namespace Glib {
+class Painter;
+}
+
 class GalleryPage : public Glob {
  public:
   static constexpr int kWidth = 1000;
@@ -37,7 +42,7 @@ class GalleryPage : public Glob {
     Kw::Box<int> box;
   };
   Kw::Box<int> boxFromTop(int left, int top, int width, int height) const;
-  void drawPlanned(class ChromePainter& p);
+  void drawPlanned(Glib::Painter& p, const GalleryLook& look);
 
   String title_;
   String summary_;

@@ -2,9 +2,7 @@
 
 #include <cstdio>
 
-#include "gallery/GalleryStyle.h"
-
-using namespace GalleryStyle;
+#include "gallery/GalleryLook.h"
 
 KeyProbe::KeyProbe(const GlobCreationInfo& info) : Glob(info) {
   set_name("Key probe");
@@ -92,17 +90,22 @@ int KeyProbe::react(Event* e) {
 }
 
 void KeyProbe::draw() {
-  ChromePainter p(*canvas());
+  Glib::Painter p(*canvas());
   if (!p.active()) return;
+  const GalleryLook look(getPalette());
+  using F = GalleryLook::Font;
   const Kw::Box<int> b = p.bounds();
   const bool focused = get_kbd_focus() == this;
-  p.roundedRect(b, 4, Colour::fromHex(0x25272B));
-  p.roundedOutline(b, 4, focused ? kAccentSoft : kCardEdge);
+  // A text field: a sunken well of the entry colour, marked while it has the keyboard.
+  look.well(p, b, look.role(Palette::Base));
+  if (focused) {
+    p.focusRect(Kw::Box<int>(b.x0 + 3, b.y0 + 3, b.x1 - 3, b.y1 - 3), look.role(Palette::Focus));
+  }
   const Kw::Box<int> inner(b.x0 + 12, b.y0, b.x1 - 12, b.y1);
   if (shown_.empty()) {
-    p.text(focused ? "Press any key\xE2\x80\xA6" : "Click here, then press keys", inner, kBodyFont,
-           kTextFaint);
+    look.label(p, focused ? "Press any key\xE2\x80\xA6" : "Click here, then press keys", inner,
+               F::Body, look.role(Palette::Ghost));
   } else {
-    p.text(shown_, inner, kMonoFont, kTextStrong);
+    look.label(p, shown_, inner, F::Mono, look.role(Palette::Text));
   }
 }

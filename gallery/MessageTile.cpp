@@ -1,9 +1,7 @@
 #include "gallery/MessageTile.h"
 
-#include "gallery/GalleryStyle.h"
+#include "gallery/GalleryLook.h"
 #include "platform/glob/GlobHandle.h"
-
-using namespace GalleryStyle;
 
 MessageTile::MessageTile(const GlobCreationInfo& info, const String& label, const String& caption,
                          const String& message, Delivery delivery)
@@ -53,15 +51,23 @@ void MessageTile::deliver() {
 }
 
 void MessageTile::draw() {
-  ChromePainter p(*canvas());
+  Glib::Painter p(*canvas());
   if (!p.active()) return;
+  const GalleryLook look(getPalette());
+  using F = GalleryLook::Font;
   const Kw::Box<int> b = p.bounds();
-  const Colour face = pressed_ ? kCardInset : hover_ ? Colour::fromHex(0x4A4E56) : kCard;
-  p.roundedRect(b, 6, face);
-  p.roundedOutline(b, 6, hover_ ? kAccent : kCardEdge);
-  p.fillRect(Kw::Box<int>(b.x0 + 16, b.y1 - 20, b.x0 + 40, b.y1 - 17), kAccent);
-  p.text(label_, Kw::Box<int>(b.x0 + 16, b.y1 - 48, b.x1 - 16, b.y1 - 26), kBodyBold, kTextStrong);
-  p.text(caption_, Kw::Box<int>(b.x0 + 16, b.y1 - 70, b.x1 - 16, b.y1 - 50), kSmallFont, kTextDim);
-  p.text("\xE2\x86\x92 \"" + message_ + "\"",
-         Kw::Box<int>(b.x0 + 16, b.y0 + 8, b.x1 - 16, b.y0 + 30), kMonoFont, kMessage);
+  // A large button: raised, lighter under the pointer, sunken while pressed.
+  const Colour face = hover_ ? getPalette().windowShade(4) : look.role(Palette::Window);
+  if (pressed_) {
+    look.well(p, b, look.hover());
+  } else {
+    look.card(p, b, face);
+  }
+  p.fillRect(Kw::Box<int>(b.x0 + 16, b.y1 - 20, b.x0 + 40, b.y1 - 17), look.accent());
+  look.label(p, label_, Kw::Box<int>(b.x0 + 16, b.y1 - 48, b.x1 - 16, b.y1 - 26), F::Bold,
+             look.strongText());
+  look.label(p, caption_, Kw::Box<int>(b.x0 + 16, b.y1 - 70, b.x1 - 16, b.y1 - 50), F::Small,
+             look.dimText());
+  look.label(p, "\xE2\x86\x92 \"" + message_ + "\"",
+             Kw::Box<int>(b.x0 + 16, b.y0 + 8, b.x1 - 16, b.y0 + 30), F::Mono, look.message());
 }

@@ -1,8 +1,6 @@
 #include "gallery/PageSelector.h"
 
-#include "gallery/GalleryStyle.h"
-
-using namespace GalleryStyle;
+#include "gallery/GalleryLook.h"
 
 PageSelector::PageSelector(const GlobCreationInfo& info, MessageLog& log) : Glob(info), log_(log) {
   set_name("Pages");
@@ -46,14 +44,17 @@ int PageSelector::react(Event* e) {
 }
 
 void PageSelector::draw() {
-  ChromePainter p(*canvas());
+  Glib::Painter p(*canvas());
   if (!p.active()) return;
+  const GalleryLook look(getPalette());
+  using F = GalleryLook::Font;
   const Kw::Box<int> b = p.bounds();
-  p.fillRect(b, kSidebar);
-  p.vline(b.x1 - 1, b.y0, b.y1, kLine);
-  p.text("SUBSYSTEMS", Kw::Box<int>(22, b.y1 - 38, b.x1 - 16, b.y1 - 14), kCaptionFont, kTextFaint);
-  p.dot(XY<int>(26, 22), 3.5, kReady);
-  p.text("ready", Kw::Box<int>(36, 12, 96, 32), kSmallFont, kTextFaint);
-  p.dot(XY<int>(104, 22), 3.5, kPlanned);
-  p.text("planned", Kw::Box<int>(114, 12, b.x1 - 16, 32), kSmallFont, kTextFaint);
+  p.fillRect(b, look.sidebar());
+  p.fillRect(Kw::Box<int>(b.x1 - 1, b.y0, b.x1, b.y1), look.line());
+  look.label(p, "SUBSYSTEMS", Kw::Box<int>(22, b.y1 - 38, b.x1 - 16, b.y1 - 14), F::Caption,
+             look.faintText());
+  look.lamp(p, XY<int>(26, 22), GalleryLook::kReady);
+  look.label(p, "ready", Kw::Box<int>(36, 12, 96, 32), F::Small, look.faintText());
+  look.lamp(p, XY<int>(104, 22), look.planned());
+  look.label(p, "planned", Kw::Box<int>(114, 12, b.x1 - 16, 32), F::Small, look.faintText());
 }

@@ -1,8 +1,6 @@
 #include "gallery/PageTab.h"
 
-#include "gallery/GalleryStyle.h"
-
-using namespace GalleryStyle;
+#include "gallery/GalleryLook.h"
 
 PageTab::PageTab(const GlobCreationInfo& info, const String& title, int index, bool ready)
     : Glob(info), title_(title), index_(index), ready_(ready) {
@@ -33,17 +31,20 @@ int PageTab::react(Event* e) {
 }
 
 void PageTab::draw() {
-  ChromePainter p(*canvas());
+  Glib::Painter p(*canvas());
   if (!p.active()) return;
+  const GalleryLook look(getPalette());
+  using F = GalleryLook::Font;
   const Kw::Box<int> b = p.bounds();
   if (selected_) {
-    p.fillRect(b, kSidebarSelected);
-    p.fillRect(Kw::Box<int>(b.x0, b.y0, b.x0 + 3, b.y1), kAccent);
+    p.fillRect(b, look.role(Palette::Window));
+    p.fillRect(Kw::Box<int>(b.x0, b.y0, b.x0 + 3, b.y1), look.accent());
   } else if (hover_) {
-    p.fillRect(b, kSidebarHover);
+    p.fillRect(b, look.hover());
   }
-  p.text(title_, Kw::Box<int>(b.x0 + 22, b.y0, b.x1 - 34, b.y1), selected_ ? kBodyBold : kBodyFont,
-         selected_ ? kTextStrong : kText);
+  look.label(p, title_, Kw::Box<int>(b.x0 + 22, b.y0, b.x1 - 34, b.y1),
+             selected_ ? F::Bold : F::Body, selected_ ? look.strongText() : look.text());
   // Green: the subsystem's controls are on the page; grey: still to come.
-  p.dot(XY<int>(b.x1 - 20, (b.y0 + b.y1) / 2), 3.5, ready_ ? kReady : kPlanned);
+  look.lamp(p, XY<int>(b.x1 - 20, (b.y0 + b.y1) / 2),
+            ready_ ? GalleryLook::kReady : look.planned());
 }

@@ -9,8 +9,8 @@
 
 #include "gallery/GalleryApp.h"
 #include "gallery/GalleryOptions.h"
-#include "gallery/OffscreenScreen.h"
 #include "gallery/TreeDump.h"
+#include "platform/backend/HeadlessBackend.h"
 #include "platform/backend/WindowBackend.h"
 
 namespace {
@@ -74,9 +74,9 @@ int main(int argc, char** argv) {
     window = WindowBackend::open("globkit gallery", options.width, options.height);
     if (!window) std::fprintf(stderr, "globkit-gallery: no window available, running headless\n");
   }
-  std::unique_ptr<Backend> offscreen;
-  if (!window) offscreen = std::make_unique<OffscreenScreen>(options.width, options.height);
-  Backend& screen = window ? static_cast<Backend&>(*window) : *offscreen;
+  std::unique_ptr<HeadlessBackend> headless;
+  if (!window) headless = std::make_unique<HeadlessBackend>(options.width, options.height);
+  Backend& screen = window ? static_cast<Backend&>(*window) : *headless;
   const double scale = window ? window->pixelScale() : 1.0;
 
   auto app = std::make_unique<GalleryApp>(screen.root(), log);

@@ -2,8 +2,6 @@
 
 #include <algorithm>
 
-#include "platform/misc/Diagnostics.h"
-
 HeadlessBackend::HeadlessBackend(int width, int height)
     : root_(std::make_unique<RootGlob>(std::max(1, width), std::max(1, height))),
       renderer_(std::make_unique<RootRenderer>(*root_)) {}
@@ -26,10 +24,6 @@ bool HeadlessBackend::screenshot(const String& pngPath) {
 }
 
 bool HeadlessBackend::screenshot(const Glob& glob, const String& pngPath) {
-  if (!is_good_glob_ptr(&glob) || glob.root() != root_.get() || !glob.canvas()->isMappedToRoot()) {
-    diagWarning("screenshot: the Glob is not shown on this screen: " + pngPath + "\n");
-    return false;
-  }
   renderer_->render();
-  return renderer_->writePng(pngPath, glob.canvas()->visibleRootRect());
+  return renderer_->writePng(pngPath, glob);
 }

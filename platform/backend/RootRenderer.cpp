@@ -72,3 +72,11 @@ bool RootRenderer::writePng(const String& path, const Kw::Box<int>& rootArea) co
   }
   return true;
 }
+
+bool RootRenderer::writePng(const String& path, const Glob& glob) const {
+  if (!is_good_glob_ptr(&glob) || glob.root() != &root_ || !glob.canvas()->isMappedToRoot()) {
+    diagWarning("screenshot: the Glob is not shown on this screen: " + path + "\n");
+    return false;
+  }
+  return writePng(path, glob.canvas()->visibleRootRect());
+}

@@ -1,6 +1,7 @@
 #pragma once
 // Keeps the root's pixels: an ARGB32 image the size of the root, repainted where damaged. Both
-// back ends use it; the window back end then presents the areas of the last repaint.
+// back ends use it (one repaint session per screen); the window back end then presents the
+// areas of the last repaint.
 #include <cairo.h>
 
 #include <cstdint>
@@ -38,6 +39,9 @@ class RootRenderer {
   // Writes a root area (bottom-up box), clipped to the image, to a PNG file. False on failure,
   // reported through Diagnostics.
   bool writePng(const String& path, const Kw::Box<int>& rootArea) const;
+  // Writes the visible part of `glob` to a PNG file. False, through Diagnostics, when the Glob
+  // is not shown on this root or the file cannot be written.
+  bool writePng(const String& path, const Glob& glob) const;
 
  private:
   void makeSurface(int width, int height);

@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <cstdlib>
 
-#include "platform/glib/CairoPaintSession.h"
 #include "platform/misc/Diagnostics.h"
 #include "platform/misc/WindowsClipboard.h"
 #include "platform/os/OS.h"
@@ -17,28 +16,6 @@ bool displayAvailable() {
   const char* w = std::getenv("WAYLAND_DISPLAY");
   const char* driver = SDL_GetHint(SDL_HINT_VIDEODRIVER);
   return (x && *x) || (w && *w) || (driver && *driver);
-}
-
-// Writes the part `area` (top-down pixels) of `source` to a PNG file.
-bool writePng(cairo_surface_t* source, const Kw::Box<int>& area, const String& path) {
-  if (area.empty()) {
-    diagWarning("screenshot: nothing visible to write to " + path + "\n");
-    return false;
-  }
-  cairo_surface_t* out =
-      cairo_image_surface_create(CAIRO_FORMAT_ARGB32, area.width(), area.height());
-  cairo_t* cr = cairo_create(out);
-  cairo_set_source_surface(cr, source, -area.x0, -area.y0);
-  cairo_set_operator(cr, CAIRO_OPERATOR_SOURCE);
-  cairo_paint(cr);
-  cairo_destroy(cr);
-  const cairo_status_t status = cairo_surface_write_to_png(out, path.c_str());
-  cairo_surface_destroy(out);
-  if (status != CAIRO_STATUS_SUCCESS) {
-    diagError("screenshot: cannot write " + path + ": " + cairo_status_to_string(status) + "\n");
-    return false;
-  }
-  return true;
 }
 
 }  // namespace
@@ -65,16 +42,18 @@ bool WindowBackend::create(const String& title, int width, int height) {
     diagWarning(String("window: SDL cannot open a window: ") + SDL_GetError() + "\n");
     return false;
   }
-  renderer_ = SDL_CreateRenderer(window_, -1, 0);
-  if (!renderer_) renderer_ = SDL_CreateRenderer(window_, -1, SDL_RENDERER_SOFTWARE);
-  if (!renderer_) {
+  sdlRenderer_ = SDL_CreateRenderer(window_, -1, 0);
+  if (!sdlRenderer_) sdlRenderer_ = SDL_CreateRenderer(window_, -1, SDL_RENDERER_SOFTWARE);
+  if (!sdlRenderer_) {
     diagWarning(String("window: SDL cannot draw into the window: ") + SDL_GetError() + "\n");
     return false;
   }
   SDL_GetWindowSize(window_, &geometry_.windowWidth, &geometry_.windowHeight);
-  SDL_GetRendererOutputSize(renderer_, &geometry_.rootWidth, &geometry_.rootHeight);
-  root_ = std::make_unique<RootGlob>(geometry_.rootWidth, geometry_.rootHeight);
-  if (!makeSurfaces()) return false;
+  SDL_GetRendererOutputSize(sdlRenderer_, &geometry_.rootWidth, &geometry_.rootHeight);
+  root_ = std::make_unique<RootGlob>(std::max(1, geometry_.rootWidth),
+                                     std::max(1, geometry_.rootHeight));
+  image_ = std::make_unique<RootRenderer>(*root_);
+  if (!makeTexture()) return false;
   cursors_ = std::make_unique<SdlCursorSet>();
   clipboard_ = std::make_unique<SdlClipboardProvider>();
   WindowsClipboard::setProvider(clipboard_.get());
@@ -92,8 +71,9 @@ WindowBackend::~WindowBackend() {
     WindowsClipboard::setProvider(nullptr);
   }
   clipboard_.reset();
-  releaseSurfaces();
-  if (renderer_) SDL_DestroyRenderer(renderer_);
+  image_.reset();
+  releaseTexture();
+  if (sdlRenderer_) SDL_DestroyRenderer(sdlRenderer_);
   if (window_) SDL_DestroyWindow(window_);
   if (sdlStarted_) {
     SDL_StopTextInput();
@@ -103,18 +83,13 @@ WindowBackend::~WindowBackend() {
   OS()->keyboard().setModifiers(0);
 }
 
-bool WindowBackend::makeSurfaces() {
-  const int w = std::max(1, geometry_.rootWidth);
-  const int h = std::max(1, geometry_.rootHeight);
-  surface_ = cairo_image_surface_create(CAIRO_FORMAT_ARGB32, w, h);
-  if (cairo_surface_status(surface_) != CAIRO_STATUS_SUCCESS) {
-    diagError("window: cannot make a " + std::to_string(w) + "x" + std::to_string(h) + " image\n");
-    return false;
-  }
-  session_ = std::make_unique<Glib::CairoPaintSession>(surface_);
+bool WindowBackend::makeTexture() {
+  // The texture is the root's size, as the image becomes at its next repaint.
+  const int w = root_->canvas()->width();
+  const int h = root_->canvas()->height();
   // Cairo's ARGB32 is a native-endian 32-bit word with alpha on top: SDL's ARGB8888.
   texture_ =
-      SDL_CreateTexture(renderer_, SDL_PIXELFORMAT_ARGB8888, SDL_TEXTUREACCESS_STREAMING, w, h);
+      SDL_CreateTexture(sdlRenderer_, SDL_PIXELFORMAT_ARGB8888, SDL_TEXTUREACCESS_STREAMING, w, h);
   if (!texture_) {
     diagError(String("window: SDL cannot make a texture: ") + SDL_GetError() + "\n");
     return false;
@@ -124,10 +99,7 @@ bool WindowBackend::makeSurfaces() {
   return true;
 }
 
-void WindowBackend::releaseSurfaces() {
-  session_.reset();
-  if (surface_) cairo_surface_destroy(surface_);
-  surface_ = nullptr;
+void WindowBackend::releaseTexture() {
   if (texture_) SDL_DestroyTexture(texture_);
   texture_ = nullptr;
 }
@@ -206,14 +178,15 @@ void WindowBackend::deliverComposedText(const String& utf8) {
 void WindowBackend::fitToWindow() {
   WindowGeometry g;
   SDL_GetWindowSize(window_, &g.windowWidth, &g.windowHeight);
-  SDL_GetRendererOutputSize(renderer_, &g.rootWidth, &g.rootHeight);
+  SDL_GetRendererOutputSize(sdlRenderer_, &g.rootWidth, &g.rootHeight);
   const bool resized = g.rootWidth != geometry_.rootWidth || g.rootHeight != geometry_.rootHeight;
   geometry_ = g;
   if (!resized) return;
-  releaseSurfaces();
-  // Reshaping the root damages all of it, so the next repaint fills the new image.
-  root_->reshape_canvas(0, 0, g.rootWidth, g.rootHeight);
-  if (!makeSurfaces()) quit_ = true;
+  releaseTexture();
+  // Reshaping the root damages all of it: the next repaint makes the image the new size and
+  // fills it, and all of it goes up to the new texture.
+  root_->reshape_canvas(0, 0, std::max(1, g.rootWidth), std::max(1, g.rootHeight));
+  if (!makeTexture()) quit_ = true;
 }
 
 void WindowBackend::followFocus() {
@@ -232,16 +205,16 @@ void WindowBackend::followFocus() {
 // --- Painting ---
 
 void WindowBackend::render() {
-  if (!session_) return;
-  if (root_->paint(*session_)) upload(session_->presentedAreas());
+  if (image_->render() && texture_) upload(image_->presentedAreas());
   present();
 }
 
 void WindowBackend::upload(const std::vector<Kw::Box<int>>& areas) {
-  const Kw::Box<int> bounds(0, 0, cairo_image_surface_get_width(surface_),
-                            cairo_image_surface_get_height(surface_));
-  const unsigned char* pixels = cairo_image_surface_get_data(surface_);
-  const int stride = cairo_image_surface_get_stride(surface_);
+  cairo_surface_t* image = image_->surface();
+  cairo_surface_flush(image);
+  const Kw::Box<int> bounds(0, 0, image_->width(), image_->height());
+  const unsigned char* pixels = cairo_image_surface_get_data(image);
+  const int stride = cairo_image_surface_get_stride(image);
   for (const auto& a : areas) {
     const Kw::Box<int> r = a.intersection(bounds);
     if (r.empty()) continue;
@@ -256,22 +229,16 @@ void WindowBackend::present() {
   needsPresent_ = false;
   // The window's back buffer is not kept between frames, so the whole texture is copied; only
   // the changed rectangles travel from the image to the texture.
-  SDL_RenderCopy(renderer_, texture_, nullptr, nullptr);
-  SDL_RenderPresent(renderer_);
+  SDL_RenderCopy(sdlRenderer_, texture_, nullptr, nullptr);
+  SDL_RenderPresent(sdlRenderer_);
 }
 
 bool WindowBackend::screenshot(const String& pngPath) {
   render();
-  return writePng(surface_, Kw::Box<int>(0, 0, geometry_.rootWidth, geometry_.rootHeight), pngPath);
+  return image_->writePng(pngPath, root_->canvas()->rootRect());
 }
 
 bool WindowBackend::screenshot(const Glob& glob, const String& pngPath) {
-  if (!is_good_glob_ptr(&glob) || glob.root() != root_.get()) {
-    diagWarning("screenshot: the Glob is not on this screen: " + pngPath + " not written\n");
-    return false;
-  }
   render();
-  const Kw::Box<int> v = glob.canvas()->visibleRootRect();
-  const int h = geometry_.rootHeight;
-  return writePng(surface_, Kw::Box<int>(v.x0, h - v.y1, v.x1, h - v.y0), pngPath);
+  return image_->writePng(pngPath, glob);
 }

@@ -1,9 +1,9 @@
 #pragma once
 // The screen in a real, resizable SDL window. Each step takes the window's input and feeds it
-// to the root, fires due ticks, delivers queued messages, repaints the damage into a Cairo
-// image and uploads only the changed rectangles to the window's texture. While it lives the
-// keyboard modifiers of OS() follow the real keys, the pointer takes the shape the Glob under it
-// asks for, and the library's clipboard is the system's.
+// to the root, fires due ticks, delivers queued messages, repaints the damage through the
+// screen's RootRenderer and uploads only the areas it repainted to the window's texture. While it
+// lives the keyboard modifiers of OS() follow the real keys, the pointer takes the shape the Glob
+// under it asks for, and the library's clipboard is the system's.
 //
 // The root counts drawable pixels: on a HiDPI screen it is larger than the window's size in
 // window units, by pixelScale(), and pointer positions are scaled to match.
@@ -12,14 +12,11 @@
 #include <memory>
 
 #include "platform/backend/Backend.h"
+#include "platform/backend/RootRenderer.h"
 #include "platform/backend/SdlClipboardProvider.h"
 #include "platform/backend/SdlCursorSet.h"
 #include "platform/backend/SdlInputTranslator.h"
 #include "platform/glob/GlobHandle.h"
-
-namespace Glib {
-class CairoPaintSession;
-}
 
 class WindowBackend : public Backend {
  public:
@@ -33,7 +30,7 @@ class WindowBackend : public Backend {
 
   RootGlob& root() override { return *root_; }
   bool step(int waitMs) override;
-  cairo_surface_t* surface() override { return surface_; }
+  cairo_surface_t* surface() override { return image_->surface(); }
   void render() override;
   bool screenshot(const String& pngPath) override;
   bool screenshot(const Glob& glob, const String& pngPath) override;
@@ -41,6 +38,7 @@ class WindowBackend : public Backend {
   // Drawable pixels per window unit, across.
   double pixelScale() const;
   const WindowGeometry& geometry() const { return geometry_; }
+  RootRenderer& renderer() { return *image_; }
   // The window's identifier in SDL's numbering.
   Uint32 windowId() const { return SDL_GetWindowID(window_); }
 
@@ -51,18 +49,17 @@ class WindowBackend : public Backend {
   void apply(const TranslatedInput& input);
   void deliverComposedText(const String& utf8);
   void fitToWindow();
-  bool makeSurfaces();
-  void releaseSurfaces();
+  bool makeTexture();
+  void releaseTexture();
   void upload(const std::vector<Kw::Box<int>>& topDownAreas);
   void present();
   void followFocus();
 
   SDL_Window* window_ = nullptr;
-  SDL_Renderer* renderer_ = nullptr;
-  SDL_Texture* texture_ = nullptr;
-  cairo_surface_t* surface_ = nullptr;
-  std::unique_ptr<Glib::CairoPaintSession> session_;
+  SDL_Renderer* sdlRenderer_ = nullptr;
+  SDL_Texture* texture_ = nullptr;  // the image's size; what the window shows
   std::unique_ptr<RootGlob> root_;
+  std::unique_ptr<RootRenderer> image_;
   std::unique_ptr<SdlCursorSet> cursors_;
   std::unique_ptr<SdlClipboardProvider> clipboard_;
   SdlInputTranslator translator_;

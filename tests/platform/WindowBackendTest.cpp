@@ -29,6 +29,10 @@ class Recorder : public Glob {
     cairo_set_source_rgb(s->context(), colour_.r, colour_.g, colour_.b);
     cairo_paint(s->context());
   }
+  void setColour(const Colour& c) {
+    colour_ = c;
+    update();
+  }
   std::vector<Event> events;
 
  private:
@@ -74,6 +78,15 @@ class WindowBackendTest : public ::testing::Test {
     e.type = type;
     std::strncpy(type == SDL_TEXTINPUT ? e.text.text : e.edit.text, utf8, 31);
     push(e);
+  }
+
+  // A pixel of what the window shows, x and y from its top-left corner, as 0xRRGGBB.
+  uint32_t shown(int x, int y) {
+    SDL_Renderer* r = SDL_GetRenderer(SDL_GetWindowFromID(window_->windowId()));
+    uint32_t p = 0;
+    const SDL_Rect at{x, y, 1, 1};
+    EXPECT_EQ(SDL_RenderReadPixels(r, &at, SDL_PIXELFORMAT_ARGB8888, &p, 4), 0) << SDL_GetError();
+    return p & 0xFFFFFF;
   }
 
   std::unique_ptr<WindowBackend> window_;
@@ -140,9 +153,62 @@ TEST_F(WindowBackendTest, PaintsTheRootAndWritesScreenshots) {
     EXPECT_FALSE(window_->screenshot(String(dir) + "/missing/x.png"));
     EXPECT_TRUE(capture.contains("cannot write"));
   }
+  {
+    Diagnostics::Capture capture;
+    recorder_->unmap_canvas();
+    EXPECT_FALSE(window_->screenshot(*recorder_, part));
+    EXPECT_TRUE(capture.contains("not shown"));
+  }
   std::remove(whole.c_str());
   std::remove(part.c_str());
   rmdir(dir);
+}
+
+TEST_F(WindowBackendTest, PresentsOnlyWhatTheRepaintChanged) {
+  auto* patch =
+      new Recorder(GlobCreationInfo(20, 20, window_->root().canvas(), 10, 10), Colour(0, 0, 1));
+  window_->step(0);
+  EXPECT_EQ(shown(150, 50), 0xFF0000u);
+  EXPECT_EQ(shown(15, 75), 0x0000FFu);
+
+  // A mark in the image that no repaint asked for: if the window shows it, more than the
+  // repainted area went up.
+  cairo_surface_t* image = window_->surface();
+  cairo_surface_flush(image);
+  auto* row = reinterpret_cast<uint32_t*>(cairo_image_surface_get_data(image) +
+                                          5 * cairo_image_surface_get_stride(image));
+  row[5] = 0xFF00FF00u;
+  cairo_surface_mark_dirty(image);
+
+  patch->setColour(Colour(1, 1, 0));
+  window_->step(0);
+  // 10..30 up from the bottom of a 100-high root is 70..90 down from its top.
+  const std::vector<Kw::Box<int>> expected{Kw::Box<int>(10, 70, 30, 90)};
+  EXPECT_EQ(window_->renderer().presentedAreas(), expected);
+  EXPECT_EQ(shown(15, 75), 0xFFFF00u);
+  EXPECT_EQ(shown(150, 50), 0xFF0000u);
+  EXPECT_NE(shown(5, 5), 0x00FF00u);
+}
+
+TEST_F(WindowBackendTest, FollowsTheWindowsNewSize) {
+  window_->step(0);
+  SDL_SetWindowSize(SDL_GetWindowFromID(window_->windowId()), 300, 150);
+  SDL_Event resized{};
+  resized.type = SDL_WINDOWEVENT;
+  resized.window.event = SDL_WINDOWEVENT_SIZE_CHANGED;
+  resized.window.data1 = 300;
+  resized.window.data2 = 150;
+  push(resized);
+  window_->step(0);
+  EXPECT_EQ(window_->root().canvas()->width(), 300);
+  EXPECT_EQ(window_->root().canvas()->height(), 150);
+  EXPECT_EQ(cairo_image_surface_get_width(window_->surface()), 300);
+  EXPECT_EQ(cairo_image_surface_get_height(window_->surface()), 150);
+  // The recorder keeps its place from the bottom-left corner; all of the new image is shown.
+  EXPECT_EQ(shown(150, 100), 0xFF0000u);
+  EXPECT_EQ(shown(150, 10), window_->renderer().pixelAt(XY<int>(150, 139)) & 0xFFFFFF);
+  EXPECT_EQ(shown(290, 140), window_->renderer().pixelAt(XY<int>(290, 9)) & 0xFFFFFF);
+  EXPECT_NE(shown(290, 140), 0u);
 }
 
 TEST_F(WindowBackendTest, InstallsTheSystemClipboardWhileItLives) {
