@@ -67,9 +67,16 @@ struct ButtonInitArgs : GlobCreationInfo {
       : GlobCreationInfo(where), label(l), message(msg) {}
 };
 
+namespace Glib {
+class Image;
+class Painter;
+}  // namespace Glib
+
 class Button : public rect, public ButtonWidget<WString>, public TabOrderable {
  public:
   static constexpr double brightenFactor_ = 1.2;
+  // The thinner bevel of the small buttons of a panel's title strip.
+  static constexpr int kTitleBevelWidth = 2;
 
   Button(const WString& label, const String& message, const GlobCreationInfo& info);
   Button(const WString& label, const char* message, unsigned short width, unsigned short height,
@@ -98,6 +105,8 @@ class Button : public rect, public ButtonWidget<WString>, public TabOrderable {
   void setCol(const Colour& colour, bool redraw) override;
   void draw() override;
   const char* idstring() const override { return "button"; }
+  // The label, or the up icon's name for a button without one.
+  String describeValue() const override;
   MouseCursorID contextCursor(const XY<int>& pos) override;
   void handleMouseContainment(bool inside) override;
 
@@ -181,6 +190,16 @@ class Button : public rect, public ButtonWidget<WString>, public TabOrderable {
   Kw::Box<int> contentBox() const;
   // The label the state shows: the down label while down, when there is one.
   const WString& shownLabel() const;
+  // The face and label colours as drawn: the state's, dimmed while inactive.
+  Colour faceColour() const;
+  Colour labelColour() const;
+  bool hasKeyboardFocus() const;
+  // Where a symbol glyph standing for the label goes: the middle half of the button, nudged
+  // like a label while pressed.
+  Kw::Box<int> symbolBox() const;
+  // Draws the picture inside the bevel (shrunk to fit when larger), centred when `alone` and
+  // at the left of the room otherwise; returns the x just right of it.
+  int drawIcon(Glib::Painter& p, const Glib::Image& img, bool alone);
 
  private:
   void init();

@@ -5,8 +5,10 @@
 // picture serves both states.
 //
 // The constructors without a size make the button the size of the larger picture plus a
-// margin of kImageMargin pixels on every side; so does a zero width or height in the
-// initialisation record. A label, if given, goes to the right of the picture.
+// margin of kImageMargin pixels on every side (the standard bevel, so the picture shows at its
+// own size); so does a zero width or height in the initialisation record. A picture larger
+// than the room inside the bevel is shrunk to fit. A label, if given, goes to the right of the
+// picture.
 //
 // With a transparent background the face is not painted, and the bevel shows only while the
 // button is down or the pointer is over it: the parent shows through, as in a title strip.
@@ -25,7 +27,7 @@ struct ImageButtonInitArgs : ButtonInitArgs {
 
 class ImageButton : public Button {
  public:
-  static constexpr int kImageMargin = 3;
+  static constexpr int kImageMargin = 4;
 
   ImageButton(const WString& upImage, const WString& downImage, const String& message,
               unsigned short width, unsigned short height, Canvas* parent);

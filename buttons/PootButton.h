@@ -1,6 +1,7 @@
 #pragma once
 // The close button of a panel's title strip: a plain button reporting "poot". With no label it
 // shows a cross.
+// Like every title-strip button it has the thin bevel kTitleBevelWidth.
 #include "buttons/Button.h"
 
 class PootButton : public Button {

@@ -1,6 +1,7 @@
 #pragma once
 // The settings button of a panel's title strip: an image button showing "settings.png" and
 // reporting "screwdriver". It is at least 20 pixels wide.
+// Like every title-strip button it has the thin bevel kTitleBevelWidth.
 #include "buttons/ImageButton.h"
 
 class SettingsButton : public ImageButton {

@@ -1,9 +1,12 @@
 #include "buttons/SizeButton.h"
 
+#include "platform/glib/Painter.h"
+#include "platform/glib/Symbols.h"
 #include "platform/misc/UIString.h"
 
 SizeButton::SizeButton(bool s, unsigned short width, unsigned short height, Canvas* parent)
     : Button(WString(), "minify", width, height == 0 ? width : height, 1, parent) {
+  set_bevel_width(kTitleBevelWidth);
   set_size(s);
 }
 
@@ -37,5 +40,12 @@ void SizeButton::switch_state(button_state newState, bool silent) {
 }
 
 void SizeButton::drawText() {
-  Button::drawText();
+  const WString& label = getString();
+  if (label.size() != 1 || !Glib::Symbols::known(static_cast<int>(label[0]))) {
+    Button::drawText();
+    return;
+  }
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  Glib::drawSymbol(p, static_cast<int>(label[0]), symbolBox(), labelColour());
 }

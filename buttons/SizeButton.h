@@ -4,6 +4,7 @@
 // (">" while `size` is set, "H" otherwise), drawn with the symbol glyphs; its help text is the
 // resource string 2714 while `size` is set and 2713 otherwise. While the label freeze is
 // non-zero, set_size leaves the label alone (a panel that labels the button itself sets it).
+// Like every title-strip button it has the thin bevel kTitleBevelWidth.
 #include <cstdint>
 
 #include "buttons/Button.h"

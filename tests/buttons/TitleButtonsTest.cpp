@@ -1,6 +1,9 @@
 #include <gtest/gtest.h>
 
+#include "buttons/ImageSearchPath.h"
+#include "buttons/PinButton.h"
 #include "buttons/PootButton.h"
+#include "buttons/SettingsButton.h"
 #include "buttons/SizeButton.h"
 #include "platform/misc/Diagnostics.h"
 #include "platform/misc/ResourceStrings.h"
@@ -106,4 +109,72 @@ TEST_F(TitleButtonsTest, MissingHelpTextShowsThePlaceholder) {
   SizeButton* b = new SizeButton(true, 20, 0, panel.canvas());
   EXPECT_EQ(b->contextString(XY<int>(), nullptr), "[missing string 2714]");
   EXPECT_TRUE(cap.contains("2714"));
+}
+
+TEST_F(TitleButtonsTest, SettingsButtonIsAtLeastTwentyWide) {
+  SettingsButton* narrow = new SettingsButton(10, 0, panel.canvas());
+  EXPECT_EQ(narrow->width(), 20);
+  EXPECT_EQ(narrow->height(), 20);
+  SettingsButton* wide = new SettingsButton(24, 16, panel.canvas());
+  EXPECT_EQ(wide->width(), 24);
+  EXPECT_EQ(wide->height(), 16);
+  EXPECT_EQ(wide->getUpImage(), L"settings.png");
+  h.clickOn(*wide);
+  EXPECT_EQ(panel.texts(), Texts{"screwdriver"});
+}
+
+TEST_F(TitleButtonsTest, PinButtonLatchesBetweenItsImages) {
+  PinButton* pin = new PinButton(16, 20, panel.canvas());
+  EXPECT_EQ(pin->width(), 16);
+  EXPECT_EQ(pin->height(), 20);
+  EXPECT_EQ(pin->getUpImage(), L"pin.png");
+  EXPECT_EQ(pin->getDownImage(), L"pinned.png");
+  h.clickOn(*pin);
+  EXPECT_EQ(pin->get_state(), kButtonDown);
+  h.clickOn(*pin);
+  EXPECT_EQ(panel.texts(), (Texts{"freeze_flip on", "freeze_flip off"}));
+
+  // A panel wanting "pin on" / "pin off" renames the message.
+  pin->set_message("pin");
+  h.clickOn(*pin);
+  EXPECT_EQ(panel.texts().back(), "pin on");
+
+  PinButton copy(*pin);
+  EXPECT_EQ(copy.getDownImage(), L"pinned.png");
+  EXPECT_TRUE(copy.get_latching());
+}
+
+TEST_F(TitleButtonsTest, ImageButtonsTakeTheirPicturesSize) {
+  ImageSearchPath& path = imageSearchPath();
+  const std::vector<String> saved = path.directories();
+  path.addDirectory(String(GLOBKIT_SOURCE_DIR) + "/gallery/icons");
+  ImageButton* a = new ImageButton(L"pin.png", "a", panel.canvas());
+  EXPECT_EQ(a->width(), 16 + 2 * ImageButton::kImageMargin);
+  EXPECT_EQ(a->height(), 16 + 2 * ImageButton::kImageMargin);
+
+  ImageButtonInitArgs args(L"pin.png", L"pinned.png", "b", GlobCreationInfo(0, 30, panel.canvas()));
+  args.transparentBackground = true;
+  ImageButton* b = new ImageButton(args);
+  EXPECT_EQ(b->width(), 16 + 2 * ImageButton::kImageMargin);
+  EXPECT_EQ(b->height(), 30);
+  EXPECT_TRUE(b->getTransparentBackground());
+  path.clear();
+  for (const String& d : saved) path.addDirectory(d);
+}
+
+TEST(ImageSearchPath, FindsNamesInTheFirstDirectoryHoldingThem) {
+  ImageSearchPath path;
+  path.clear();
+  const String icons = String(GLOBKIT_SOURCE_DIR) + "/gallery/icons";
+  EXPECT_EQ(path.resolve(String("pin.png")), "pin.png");
+  path.addDirectory("/nonexistent/dir");
+  path.addDirectory(icons);
+  path.addDirectory(icons);
+  path.addDirectory("");
+  EXPECT_EQ(path.directories().size(), 2u);
+  EXPECT_EQ(path.resolve(String("pin.png")), icons + "/pin.png");
+  EXPECT_EQ(path.resolve(WString(L"pinned.png")), icons + "/pinned.png");
+  EXPECT_EQ(path.resolve(String("missing.png")), "missing.png");
+  EXPECT_EQ(path.resolve(String("/abs/x.png")), "/abs/x.png");
+  EXPECT_EQ(path.resolve(String()), "");
 }
