@@ -5,7 +5,6 @@
 #include "buttons/PootButton.h"
 #include "buttons/SettingsButton.h"
 #include "buttons/SizeButton.h"
-#include "platform/misc/Diagnostics.h"
 #include "platform/misc/ResourceStrings.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
@@ -101,14 +100,6 @@ TEST_F(TitleButtonsTest, FrozenLabelOnlyFlipsTheHelpText) {
   EXPECT_EQ(copy.getLabelFreeze(), 0x80000000u);
   EXPECT_FALSE(copy.get_size());
   EXPECT_EQ(copy.contextString(XY<int>(), nullptr), "Larger");
-}
-
-TEST_F(TitleButtonsTest, MissingHelpTextShowsThePlaceholder) {
-  resourceStrings().clear();
-  Diagnostics::Capture cap;
-  SizeButton* b = new SizeButton(true, 20, 0, panel.canvas());
-  EXPECT_EQ(b->contextString(XY<int>(), nullptr), "[missing string 2714]");
-  EXPECT_TRUE(cap.contains("2714"));
 }
 
 TEST_F(TitleButtonsTest, SettingsButtonIsAtLeastTwentyWide) {
