@@ -23,6 +23,13 @@
 // - A button made inactive while a pressure press is tracked stops tracking silently, and one
 //   subscribed to ticks for repeating leaves them.
 // - Only the bare key codes 13 and 32 activate; with a modifier held they go to the parent.
+// - set_repeating: a rate above 1000 per second keeps the shortest interval, 1 ms, rather than
+//   none; a delay that is negative or not a number counts as 0 (with a diagnostic).
+// - Receiving the tab focus takes the keyboard focus, so that Return and space reach it.
+// - The drag threshold is one setting for all buttons (dragThreshold, 3 pixels at start).
+// - Labels are drawn on one line: control characters show as spaces and text beyond 512
+//   characters is not laid out; what does not fit is clipped at the button's edge.
+// - The keyboard focus shows as a focus-coloured outline and a dotted mark inside the bevel.
 // - set_state with a value other than up or down is refused with a diagnostic.
 // - Copying copies the look and behaviour settings (label, message, colours, latching,
 //   pressure, repeat...), not the state, the value binding or the tab stops. A copy is made on
