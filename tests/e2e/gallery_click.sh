@@ -111,6 +111,10 @@ logged() { grep -qF -- "$1" "$work/log" 2>/dev/null; }
 # 1. A page selector entry: the selector logs the entry's report.
 click_on pagetab "Buttons"
 wait_for "the Buttons entry's report" logged 'Gallery  pagetab "Buttons"  "PageSelected"'
+click_on button "Apply"
+wait_for "the Apply button's report" logged 'Buttons  button "Apply"  "apply"'
+click_on button "Mute"
+wait_for "the latching button's report" logged 'Buttons  button "Mute"  "mute on"'
 
 # 2. Back to the foundation page, then a tile on it reports to its page.
 click_on pagetab "Foundation"

@@ -1,0 +1,659 @@
+#include "buttons/Button.h"
+
+#include <climits>
+#include <cmath>
+
+#include "buttons/ImageSearchPath.h"
+#include "platform/glib/FontCache.h"
+#include "platform/glib/Image.h"
+#include "platform/glib/Painter.h"
+#include "platform/glib/UiScale.h"
+#include "platform/glob/GlobHandle.h"
+#include "platform/glob/RootGlob.h"
+#include "platform/misc/Diagnostics.h"
+
+int Button::dragThreshold_ = 3;
+
+namespace {
+
+constexpr unsigned kKeyReturn = 13;
+constexpr unsigned kKeySpace = 32;
+
+bool validState(button_state s) {
+  return s == kButtonUp || s == kButtonDown;
+}
+
+// Where a copy goes: the original's parent canvas, place, size and palette.
+GlobCreationInfo placementOf(const Button& b) {
+  const Kw::Box<int>& r = b.canvas()->rect();
+  GlobCreationInfo info(static_cast<unsigned short>(r.width()),
+                        static_cast<unsigned short>(r.height()), b.canvas()->parent(), r.x0, r.y0);
+  info.palette = b.getPalette();
+  return info;
+}
+
+}  // namespace
+
+// --- Construction ---
+
+Button::Button(const WString& l, const String& message, const GlobCreationInfo& info)
+    : rect(info), label(l) {
+  set_message(message.c_str());
+  init();
+  post_init();
+}
+
+Button::Button(const WString& l, const char* message, unsigned short width, unsigned short height,
+               int flag, Canvas* parent)
+    : rect(width, height, flag, parent), label(l) {
+  set_message(message);
+  init();
+  post_init();
+}
+
+Button::Button(const ButtonInitArgs& args) : rect(args), label(args.label) {
+  set_message(args.message.c_str());
+  init();
+  applySettings(args);
+  post_init();
+  setPalette(args.palette);
+}
+
+Button::Button(const Button& other)
+    : rect(placementOf(other)), ButtonWidget<WString>(), TabOrderable(), label(other.label) {
+  init();
+  copySettingsFrom(other);
+  post_init();
+  // The original's geometry is already in screen pixels: undo any rescaling of the copy.
+  const Kw::Box<int>& r = other.canvas()->rect();
+  reshape_canvas(r.x0, r.y0, r.width(), r.height());
+}
+
+Button& Button::operator=(const Button& other) {
+  if (this == &other) return *this;
+  copySettingsFrom(other);
+  update();
+  return *this;
+}
+
+Button::~Button() = default;
+
+void Button::init() {
+  downLabel.clear();
+  upIcon.clear();
+  downIcon.clear();
+  style = kButtonStyleBevelled;
+  state = kButtonUp;
+  bevelWidth = 4;
+  textAlignment = TextAlignment::Centred;
+  latching = 0;
+  pressure = 0;
+  brightening = 1;
+  ignoreMouseClicks = 0;
+  textStyle = Glib::TextStyles::Normal;
+  reporter_.clearModifiers();
+  repeatInterval = 0;
+  repeatDelay = 0;
+  firstRepeat = false;
+  lastRepeatTime = 0;
+  mouseInside = false;
+  const Palette& p = getPalette();
+  upForeCol = downForeCol = p.get(Palette::ButtonText);
+  upBackCol = downBackCol = p.get(Palette::Button);
+  set_can_be_it(0);
+}
+
+void Button::post_init() {
+  glib_rescalecanvas(canvas());
+  ensure_canvas_is_mapped();
+}
+
+void Button::applySettings(const ButtonInitArgs& args) {
+  downLabel = args.downLabel;
+  set_latching(args.latching, args.latchingOption);
+  set_pressure_button(args.pressure ? 1 : 0);
+  set_repeating(args.repeatRate, args.repeatDelay);
+  set_ignore_mouse_clicks(args.ignoreMouseClicks ? 1 : 0);
+  setTextAlignment(args.textAlignment);
+  setTextStyle(args.textStyle);
+  set_style(args.style);
+  set_bevel_width(args.bevelWidth);
+}
+
+void Button::copySettingsFrom(const Button& other) {
+  label = other.label;
+  downLabel = other.downLabel;
+  upIcon = other.upIcon;
+  downIcon = other.downIcon;
+  style = other.style;
+  bevelWidth = other.bevelWidth;
+  textAlignment = other.textAlignment;
+  latching = other.latching;
+  pressure = other.pressure != 0 ? 1 : 0;
+  brightening = other.brightening;
+  textStyle = other.textStyle;
+  repeatInterval = other.repeatInterval;
+  repeatDelay = other.repeatDelay;
+  upForeCol = other.upForeCol;
+  downForeCol = other.downForeCol;
+  upBackCol = other.upBackCol;
+  downBackCol = other.downBackCol;
+  set_message(other.get_message().c_str());
+  procedure_ = other.procedure_;
+  setActive(other.isActive(), false);
+  ignoreMouseClicks = other.ignoreMouseClicks;
+  applyStatePalette();
+}
+
+// --- State ---
+
+void Button::setString(const WString& s) {
+  if (s == label) return;
+  label = s;
+  update();
+}
+
+void Button::set_state(button_state newState, bool redraw) {
+  if (!validState(newState)) {
+    diagWarning("Button::set_state: no state " + std::to_string(static_cast<int>(newState)) +
+                ", state kept\n");
+    return;
+  }
+  const bool changed = newState != state;
+  state = newState;
+  if (state == kButtonDown && repeatInterval >= 1) {
+    lastRepeatTime = clock();
+    firstRepeat = true;
+  }
+  applyStatePalette();
+  if (redraw && canvas() && canvas()->isMapped() && changed) update();
+}
+
+void Button::switch_state(button_state newState, bool silent) {
+  if (!validState(newState)) {
+    diagWarning("Button::switch_state: no state " + std::to_string(static_cast<int>(newState)) +
+                ", nothing reported\n");
+    return;
+  }
+  if (latching != 0) {
+    set_state(newState, true);
+    if (!silent)
+      informParent(get_message() +
+                   (state != kButtonUp ? latchingBtnDownSuffix_ : latchingBtnUpSuffix_));
+    return;
+  }
+  if (!silent) {
+    GlobHandle<Button> self(this);
+    if (pressure != 0) {
+      informParent(get_message() +
+                   (state == kButtonUp ? pressureBtnDownSuffix_ : pressureBtnUpSuffix_));
+    } else {
+      informParent("");
+    }
+    if (!self) return;
+  }
+  set_state(newState, true);
+}
+
+void Button::applyStatePalette() {
+  Palette p = getPalette();
+  const Colour fore = get_forecol();
+  const Colour back = get_backcol();
+  p.set(Palette::WindowText, fore);
+  p.set(Palette::ButtonText, fore);
+  p.set(Palette::Text, fore);
+  p.set(Palette::Window, back);
+  p.set(Palette::Button, back);
+  setPalette(p);
+}
+
+void Button::informParent(const String& msg) {
+  reporter_.report(*this, msg);
+}
+
+// --- Events ---
+//
+// The order matters: a tracked pressure press sees every event first, then ticks, then the
+// left button, then keys and messages.
+int Button::react(Event* e) {
+  if (!e) return 0;
+  if (pressure == -1) return reactWhileTracking(e);
+  if (tick_event(e)) return reactToTick();
+  if (mouse_left_event(e) && !ignoreMouseClicks) {
+    if (mouse_down_event(e)) return reactToPress(e);
+    if (mouse_up_event(e)) return reactToRelease(e);
+  }
+  if (mouse_event(e)) return rect::react(e);
+  if (key_press_event(e)) {
+    const unsigned k = e->keyCode();
+    if (k == kKeyReturn || k == kKeySpace) return activateFromKeyboard();
+    return rect::react(e);
+  }
+  if (message_event(e)) {
+    GlobHandle<Button> self(this);
+    if (messageReceived(e->text()) == kEventConsumed) return 1;
+    return self ? rect::react(e) : 1;
+  }
+  return rect::react(e);
+}
+
+int Button::reactWhileTracking(Event* e) {
+  if (!mouse_left_event(e)) return 1;
+  GlobHandle<Button> self(this);
+  if (mouse_up_event(e)) {
+    switch_state(kButtonUp, false);
+    if (!self) return 1;
+    pressure = 1;
+    if (repeatInterval != 0) clear_interest(kInterestTicks);
+    return 1;
+  }
+  if (mouse_move_event(e)) {
+    const XY<int> d = e->distance();
+    const double dx = d.x, dy = d.y;
+    const int length = static_cast<int>(std::trunc(std::sqrt(dx * dx + dy * dy)));
+    if (length > dragThreshold_) {
+      informParent(get_message() + pressureBtnDragSuffix_);
+      if (!self) return 1;
+      pressure = 1;
+      set_state(kButtonUp, true);
+    }
+  }
+  return 1;
+}
+
+int Button::reactToTick() {
+  if (repeatInterval > 0 && state == kButtonDown) {
+    const int now = clock();
+    const int wait = firstRepeat ? repeatDelay : repeatInterval;
+    if (now - lastRepeatTime > wait) {
+      firstRepeat = false;
+      lastRepeatTime = now;
+      informParent("");  // the receiver may delete the button: nothing of it is touched after
+    }
+  }
+  return 1;
+}
+
+int Button::reactToPress(Event*) {
+  GlobHandle<Button> self(this);
+  reporter_.captureModifiers();
+  switch_state(state == kButtonUp ? kButtonDown : kButtonUp, false);
+  if (!self) return 1;
+  widgetLeftClicked();
+  if (!self) return 1;
+  if (pressure != 0) pressure = -1;
+  if (repeatInterval != 0) set_interest(kInterestTicks);
+  return 1;
+}
+
+int Button::reactToRelease(Event* e) {
+  if (latching == 0) set_state(kButtonUp, true);
+  if (repeatInterval != 0) clear_interest(kInterestTicks);
+  return rect::react(e);
+}
+
+int Button::activateFromKeyboard() {
+  if (sendCentreEvent(kEventLeftDown)) sendCentreEvent(kEventLeftUp);
+  return 1;
+}
+
+bool Button::sendCentreEvent(int type) {
+  GlobHandle<Button> self(this);
+  const XY<int> centre(width() / 2, height() / 2);
+  Event ev(type);
+  ev.pos = centre;
+  ev.screenPos = centre + XY<int>(static_cast<int>(std::trunc(get_x() + 0.5)),
+                                  static_cast<int>(std::trunc(get_y() + 0.5)));
+  ev.pressPos = ev.screenPos;
+  ev.canvas = canvas();
+  event_send(&ev, false);
+  return self.alive();
+}
+
+void Button::handle_kbd_focus() {
+  update();  // the focus mark comes or goes
+}
+
+void Button::setActive(bool active, bool redraw) {
+  if (active == isActive()) return;
+  if (!active) {
+    if (latching == 0 && state == kButtonDown) set_state(kButtonUp, redraw);
+    if (pressure == -1) pressure = 1;
+    if (repeatInterval != 0) clear_interest(kInterestTicks);
+    if (glib_getCurrentMouseCanvas() == canvas()) handleMouseContainment(false);
+  }
+  rect::setActive(active, false);
+  ignoreMouseClicks = active ? 0 : 1;
+  if (redraw) update();
+}
+
+MouseCursorID Button::contextCursor(const XY<int>& pos) {
+  setDefaultCursor(ignoreMouseClicks ? kCursorArrow : kCursorHand);
+  return rect::contextCursor(pos);
+}
+
+void Button::handleMouseContainment(bool inside) {
+  if (inside == mouseInside) return;
+  mouseInside = inside;
+  if (isActive() && !ignoreMouseClicks) update();
+}
+
+String Button::describeValue() const {
+  return label.empty() ? upIcon : Kw::toUtf8(label);
+}
+
+void Button::setNewWidgetValue(WString& value) {
+  setString(value);
+  update();
+}
+
+// --- Tab order ---
+
+bool Button::isTabStopActive() {
+  return isActive() && canvas_is_mapped_to_root(canvas());
+}
+
+void Button::handleTabStopFocusReceipt() {
+  set_kbd_focus();
+}
+
+void Button::handleTabStopFocusLoss() {
+  if (get_kbd_focus() != this) return;
+  if (Glob* p = parent()) {
+    p->set_kbd_focus();
+  } else if (RootGlob* r = root()) {
+    r->setFocus(nullptr);
+  }
+}
+
+// --- Settings ---
+
+void Button::setDownString(const WString& s) {
+  if (s == downLabel) return;
+  downLabel = s;
+  update();
+}
+
+void Button::set_up_icon(const char* name) {
+  if (!name || !*name || upIcon == name) return;
+  upIcon = name;
+  update();
+}
+
+void Button::set_down_icon(const char* name) {
+  if (!name || !*name || downIcon == name) return;
+  downIcon = name;
+  update();
+}
+
+void Button::set_latching(bool latch, bool option) {
+  const int mode = latch ? (option ? 2 : 1) : 0;
+  if (mode == latching) return;
+  latching = mode;
+  update();
+}
+
+void Button::set_pressure_button(int on) {
+  if ((pressure != 0) == (on != 0)) return;
+  pressure = on != 0 ? 1 : 0;
+}
+
+void Button::set_repeating(int rate, double delay) {
+  if (rate <= 0) {
+    repeatInterval = 0;
+    return;
+  }
+  if (!std::isfinite(delay) || delay < 0.0) {
+    diagWarning("Button::set_repeating: the delay must be a finite number of seconds, 0 used\n");
+    delay = 0.0;
+  }
+  // Both halvings are deliberate.
+  const double delayMs = std::trunc(delay * 0.5 * 1000.0);
+  repeatDelay = delayMs >= INT_MAX ? INT_MAX : static_cast<int>(delayMs);
+  // A rate above 1000 per second would give no interval at all: the fastest repeat is kept.
+  repeatInterval = std::max(1, (1000 / rate) / 2);
+}
+
+void Button::set_ignore_mouse_clicks(int ignore) {
+  const int v = ignore != 0 ? 1 : 0;
+  if (v == ignoreMouseClicks) return;
+  ignoreMouseClicks = v;
+  update();
+}
+
+void Button::set_style(button_style s) {
+  if (s == style) return;
+  style = s;
+  update();
+}
+
+void Button::set_bevel_width(int w) {
+  if (w < 0 || w == bevelWidth) return;
+  bevelWidth = w;
+  update();
+}
+
+void Button::set_brightening(int b) {
+  if (b == brightening) return;
+  brightening = b;
+  update();
+}
+
+void Button::set_ranged_left(int left) {
+  setTextAlignment(left != 0 ? TextAlignment::Left : TextAlignment::Centred);
+}
+
+void Button::setTextAlignment(TextAlignment a) {
+  const int v = static_cast<int>(a);
+  if (v < 0 || v > 2 || a == textAlignment) return;
+  textAlignment = a;
+  update();
+}
+
+void Button::setTextStyle(Glib::TextStyles::TextStyle s) {
+  if (s < Glib::TextStyles::Plain || s > Glib::TextStyles::Shadowed || s == textStyle) return;
+  textStyle = s;
+  update();
+}
+
+bool Button::setDragThreshold(int pixels) {
+  if (pixels < 0) return false;
+  dragThreshold_ = pixels;
+  return true;
+}
+
+// --- Colours ---
+
+const Colour& Button::get_forecol() const {
+  return state == kButtonDown ? downForeCol : upForeCol;
+}
+
+Colour Button::get_backcol() const {
+  const Colour& c = state == kButtonDown ? downBackCol : upBackCol;
+  if (isActive() && mouseInside && brightening != 0) return scale(c, brightenFactor_);
+  return c;
+}
+
+void Button::setcols(const Colour& fore, const Colour& back) {
+  if (fore == upForeCol && fore == downForeCol && back == upBackCol && back == downBackCol) return;
+  upForeCol = downForeCol = fore;
+  upBackCol = downBackCol = back;
+  applyStatePalette();
+  update();
+}
+
+void Button::set_upcols(const Colour& fore, const Colour& back) {
+  if (fore == upForeCol && back == upBackCol) return;
+  upForeCol = fore;
+  upBackCol = back;
+  applyStatePalette();
+  update();
+}
+
+void Button::set_downcols(const Colour& fore, const Colour& back) {
+  if (fore == downForeCol && back == downBackCol) return;
+  downForeCol = fore;
+  downBackCol = back;
+  applyStatePalette();
+  update();
+}
+
+void Button::setCol(const Colour& colour, bool redraw) {
+  if (colour == upBackCol && colour == downBackCol) return;
+  upBackCol = downBackCol = colour;
+  applyStatePalette();
+  if (redraw) update();
+}
+
+// --- Drawing ---
+//
+// The face is a gentle vertical sheen in the state's colour (darker and reversed while down),
+// framed by a one-pixel outline and a bevel that is raised when up and sunken when down. An
+// inactive button's face sinks toward the base colour and its label takes the disabled colour.
+
+namespace {
+
+// Labels are one line: control characters show as spaces, and text far longer than any button
+// could show is cut before it reaches the font (the painter clips the rest).
+constexpr size_t kMaxShownChars = 512;
+
+WString displayText(const WString& s) {
+  WString out = s.substr(0, kMaxShownChars);
+  for (wchar_t& c : out) {
+    if (c < 0x20 || c == 0x7F) c = L' ';
+  }
+  return out;
+}
+
+}  // namespace
+
+Kw::Box<int> Button::contentBox() const {
+  const int inset = style == kButtonStyleFlat ? 1 : bevelWidth;
+  const int w = width(), h = height();
+  const int ix = std::min(inset, w / 2), iy = std::min(inset, h / 2);
+  return Kw::Box<int>(ix, iy, w - ix, h - iy);
+}
+
+const WString& Button::shownLabel() const {
+  return state == kButtonDown && !downLabel.empty() ? downLabel : label;
+}
+
+Kw::Box<int> Button::symbolBox() const {
+  const Kw::Box<int> c = contentBox();
+  const int side = std::min(c.width(), c.height());
+  Kw::Box<int> box = Kw::Box<int>::fromSize(c.x0 + (c.width() - side) / 2,
+                                            c.y0 + (c.height() - side) / 2, side, side);
+  if (state == kButtonDown && style != kButtonStyleFlat) box = box.translated(1, -1);
+  return box;
+}
+
+Colour Button::faceColour() const {
+  const Colour back = get_backcol();
+  return isActive() ? back : mix(back, getPalette().get(Palette::Base), 0.35);
+}
+
+Colour Button::labelColour() const {
+  return isActive() ? get_forecol() : getPalette().get(Palette::Disabled);
+}
+
+bool Button::hasKeyboardFocus() const {
+  return get_kbd_focus() == static_cast<const Glob*>(this);
+}
+
+void Button::draw() {
+  drawBackground();
+  drawEdge();
+  drawText();
+  if (procedure_) procedure_(facepath(), state);
+}
+
+void Button::drawBackground() {
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  const Colour face = faceColour();
+  if (style == kButtonStyleFlat) {
+    p.fillRect(p.bounds(), face);
+  } else if (state == kButtonDown) {
+    p.verticalGradient(p.bounds(), scale(face, 0.92), scale(face, 0.80));
+  } else {
+    p.verticalGradient(p.bounds(), scale(face, 0.90), scale(face, 1.08));
+  }
+}
+
+void Button::drawEdge() {
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  const Palette& pal = getPalette();
+  const Kw::Box<int> b = p.bounds();
+  p.outlineRect(b, edgeColour());
+  if (style != kButtonStyleFlat && bevelWidth > 1) {
+    const Colour face = faceColour();
+    const double contrast = isActive() ? 1.0 : 0.5;
+    const Colour light = mix(face, pal.get(Palette::Light), contrast);
+    const Colour shadow = mix(face, pal.get(Palette::Shadow), contrast);
+    const Kw::Box<int> inner(b.x0 + 1, b.y0 + 1, b.x1 - 1, b.y1 - 1);
+    p.depthBox(inner, state == kButtonDown ? Glib::Bevel::Sunken : Glib::Bevel::Raised,
+               bevelWidth - 1, light, shadow);
+  }
+  const Kw::Box<int> content = contentBox();
+  if (latching == 2 && state == kButtonDown) {
+    // The lamp of a latched option button.
+    p.fillRect(Kw::Box<int>(content.x0 + 1, content.y0, content.x1 - 1, content.y0 + 2),
+               pal.get(Palette::Highlight));
+  }
+  if (hasKeyboardFocus()) p.focusRect(content, pal.get(Palette::Focus));
+}
+
+void Button::drawText() {
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  const int w = width(), h = height();
+  // Labels may use the bevel's height (small buttons) but keep clear of its sides.
+  const int side = std::min(w / 2, (style == kButtonStyleFlat ? 1 : bevelWidth) + 2);
+  Kw::Box<int> box(side, 1, w - side, h - 1);
+  if (state == kButtonDown && style != kButtonStyleFlat) box = box.translated(1, -1);
+  const WString text = displayText(shownLabel());
+
+  const String& icon = state == kButtonDown && !downIcon.empty() ? downIcon : upIcon;
+  if (!icon.empty()) {
+    const Kw::Ptr<Glib::Image> img = Glib::Image::load(imageSearchPath().resolve(icon));
+    if (img) box.x0 = drawIcon(p, *img, text.empty()) + 4;
+  }
+  if (text.empty() || box.empty()) return;
+  p.text(text, box, *Glib::fonts().standard(), labelColour(), textAlignment, textStyle);
+}
+
+int Button::drawIcon(Glib::Painter& p, const Glib::Image& img, bool alone) {
+  // A picture larger than the room inside the bevel is shrunk to fit, keeping its shape.
+  const Kw::Box<int> room = contentBox();
+  const int iw = img.width(), ih = img.height();
+  if (iw <= 0 || ih <= 0 || room.empty()) return room.x0;
+  const double fit = std::min(
+      {1.0, static_cast<double>(room.width()) / iw, static_cast<double>(room.height()) / ih});
+  const int dw = std::max(1, static_cast<int>(std::lround(iw * fit)));
+  const int dh = std::max(1, static_cast<int>(std::lround(ih * fit)));
+  const int shift = state == kButtonDown && style != kButtonStyleFlat ? 1 : 0;
+  // Alone, the picture is centred on the button; with a label it leads the label.
+  const int x = (alone ? (width() - dw) / 2 : room.x0) + shift;
+  const int y = (height() - dh) / 2 - shift;
+  const double opacity = isActive() ? 1.0 : 0.45;
+  if (fit >= 1.0) {
+    p.image(img, XY<int>(x, y), opacity);
+  } else if (cairo_t* cr = p.cairo()) {
+    cairo_save(cr);
+    cairo_rectangle(cr, x, p.cairoY(y + dh), dw, dh);
+    cairo_clip(cr);
+    cairo_translate(cr, x, p.cairoY(y + dh));
+    cairo_scale(cr, fit, fit);
+    cairo_set_source_surface(cr, img.surface(), 0, 0);
+    cairo_pattern_set_filter(cairo_get_source(cr), CAIRO_FILTER_GOOD);
+    cairo_paint_with_alpha(cr, opacity);
+    cairo_restore(cr);
+  }
+  return x + dw;
+}
+
+Colour Button::edgeColour() {
+  const Palette& pal = getPalette();
+  return hasKeyboardFocus() ? pal.get(Palette::Focus) : pal.get(Palette::Border);
+}
