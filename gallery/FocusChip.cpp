@@ -1,0 +1,37 @@
+#include "gallery/FocusChip.h"
+
+#include "gallery/GalleryLook.h"
+#include "platform/glib/Painter.h"
+#include "platform/kw/String.h"
+
+FocusChip::FocusChip(const GlobCreationInfo& info, const String& label)
+    : Glob(info), label_(label) {
+  setDefaultCursor(kCursorHand);
+}
+
+int FocusChip::react(Event* e) {
+  if (mouse_left_event(e) && mouse_down_event(e)) {
+    requestTabStopFocus();
+    return 1;
+  }
+  return Glob::react(e);
+}
+
+void FocusChip::handleTabStopFocusLoss() {
+  if (get_kbd_focus() == this) {
+    if (Glob* p = parent()) p->set_kbd_focus();
+  }
+}
+
+void FocusChip::draw() {
+  Glib::Painter p(*canvas());
+  const GalleryLook look(getPalette());
+  const bool focused = get_kbd_focus() == this;
+  look.card(p, p.bounds(), focused ? look.hover() : look.role(Palette::Button));
+  look.label(p, label_, p.bounds(), GalleryLook::Font::Body,
+             focused ? look.strongText() : look.text());
+  if (focused) {
+    const Kw::Box<int> b = p.bounds();
+    p.outlineRect(Kw::Box<int>(b.x0 + 2, b.y0 + 2, b.x1 - 2, b.y1 - 2), look.accent(), 2);
+  }
+}
