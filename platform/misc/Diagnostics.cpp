@@ -7,6 +7,7 @@ namespace {
 struct State {
   Diagnostics::Sink sink;
   DiagLevel threshold = DiagLevel::Warning;
+  int currentNumber = -1;
 };
 
 State& state() {
@@ -41,6 +42,18 @@ void Diagnostics::print(DiagLevel level, const String& text) {
   if (text.empty() || text.back() != '\n') std::fputc('\n', stderr);
 }
 
+void Diagnostics::print(int numberedLevel, const String& text) {
+  State& s = state();
+  const int outer = s.currentNumber;
+  s.currentNumber = numberedLevel;
+  print(DiagLevel::Warning, text);
+  s.currentNumber = outer;
+}
+
+int Diagnostics::numberOfCurrentLine() {
+  return state().currentNumber;
+}
+
 void Diagnostics::setThreshold(DiagLevel level) {
   state().threshold = level;
 }
@@ -56,7 +69,10 @@ Diagnostics::Sink Diagnostics::setSink(Sink sink) {
 
 Diagnostics::Capture::Capture() : previousThreshold_(threshold()) {
   setThreshold(DiagLevel::Debug);
-  previous_ = setSink([this](DiagLevel, const String& text) { lines_.push_back(text); });
+  previous_ = setSink([this](DiagLevel, const String& text) {
+    lines_.push_back(text);
+    numbers_.push_back(numberOfCurrentLine());
+  });
 }
 
 Diagnostics::Capture::~Capture() {

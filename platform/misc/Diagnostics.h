@@ -15,6 +15,11 @@ class Diagnostics {
   // Prints `text` when `level` is at or above the threshold. The text is printed as given:
   // callers that want a line break include it.
   static void print(DiagLevel level, const String& text);
+  // The older numbered form, for reports whose number is part of their contract: the line is
+  // printed at Warning severity and the number travels with it (numberOfCurrentLine() inside
+  // a sink, Capture::numbers()). Lines printed by the other form carry -1.
+  static void print(int numberedLevel, const String& text);
+  static int numberOfCurrentLine();
   static void setThreshold(DiagLevel level);
   static DiagLevel threshold();
 
@@ -30,11 +35,17 @@ class Diagnostics {
     Capture& operator=(const Capture&) = delete;
 
     const std::vector<String>& lines() const { return lines_; }
+    // The number of each line (-1 for lines without one), in step with lines().
+    const std::vector<int>& numbers() const { return numbers_; }
     bool contains(const String& fragment) const;
-    void clear() { lines_.clear(); }
+    void clear() {
+      lines_.clear();
+      numbers_.clear();
+    }
 
    private:
     std::vector<String> lines_;
+    std::vector<int> numbers_;
     Sink previous_;
     DiagLevel previousThreshold_;
   };

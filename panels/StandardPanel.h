@@ -1,0 +1,232 @@
+#pragma once
+// The framed container that panels, dialogues and most composite controls are built on: a
+// background and a border of a chosen style, children placed from any of eight origins or
+// relative to one another, a row of standard title widgets whose messages become virtual
+// operations, modal display over a shade, and a tab order for its children.
+//
+// Choices made here:
+// - Layout arithmetic (origins, anchoring of widgets at top and right origins, relative
+//   placement) is in PanelGeometry.h. Every child is placed again whenever something it
+//   depends on changes: the panel's size, border or strips, or its reference widget.
+// - addWidget's last argument names the widget after which the new one goes in the widget
+//   list and in the tab order; null (or a widget not in the list) appends.
+// - A child that is a TabOrderable joins the panel's tab order when it is added and leaves it
+//   when it is removed. The standard widgets are not tab stops.
+// - setWidgetPos and translateWidgetPos on a relatively placed widget turn it into an
+//   absolute one from OriginBottomLeft. When a reference widget is removed or deleted, the
+//   widgets placed against it stay where they are, likewise from OriginBottomLeft.
+// - A child deleted behind the panel's back keeps its entry (with a null widget, counted by
+//   numWidgets) until it is removed by address or the panel is destroyed, where it is
+//   reported as a double deletion. Every other operation skips it.
+// - removeWidget(widget, false) only forgets the widget: it stays a child Glob and keeps its
+//   place on the canvas.
+// - The size and border of the configuration-record constructor come from the keys "width",
+//   "height" (the arguments are their defaults), "x", "y", "border" and "title".
+// - Constructors without a canvas put the panel on the current screen (unattached when there
+//   is none). The bool of the palette forms is the panel's initial dismissable state.
+//   Panels start pinned (not dismissable) unless told otherwise.
+// - Minimum size: reshape_canvas never makes the panel smaller than it (except when
+//   minimised); setMinSize grows the panel if it is smaller; resetMinSize removes the limit.
+// - Minimising (size flag SizeMinimised) keeps the top edge where it is, shrinks the panel to
+//   its border and title strip, and hides the widget-list children and the do-it button; the
+//   full size brings back those that were shown.
+// - handlePoot's default returns true: the "poot" message is passed on, unhandled.
+// - Modal display: setModal returns the depth after the call. Leaving depth 1 removes the
+//   shade and restores the pin state and the pin button's active state saved on entry.
+//   setModal(false) at depth 0 changes nothing and returns 0. The shade covers the panel's
+//   screen; the panel's top-level ancestor (the panel itself for a panel on the screen) is
+//   raised above it. A panel on no screen counts depth but shows no shade.
+// - "StdPanelTitleChanged" and "pin on"/"pin off" are handled as such only while the panel has
+//   a title box or a pin button; otherwise they reach handleMessageEvent like any message.
+#include <memory>
+#include <vector>
+
+#include "foundation/TabOrderManager.h"
+#include "foundation/rect.h"
+#include "panels/PanelGeometry.h"
+#include "panels/PanelTitleBox.h"
+#include "panels/WidgetDetails.h"
+#include "platform/glob/GlobHandle.h"
+#include "platform/kw/String.h"
+
+class ModalShade;
+class configb;
+
+class StandardPanel : public rect {
+ public:
+  static const char* const doItMsg;          // "do_it"
+  static const char* const titleChangedMsg;  // "StdPanelTitleChanged"
+  static constexpr unsigned kTabKey = 9;
+  // The diagnostic level of the double-deletion report.
+  static constexpr int kDoubleDeletionLevel = 8;
+
+  StandardPanel(unsigned short width, unsigned short height);
+  StandardPanel(unsigned short width, unsigned short height, const Palette& palette,
+                bool dismissable, Canvas* parent);
+  explicit StandardPanel(XY<int> size);
+  StandardPanel(XY<int> size, const Palette& palette, bool dismissable, Canvas* parent);
+  StandardPanel(const configb& config, unsigned short width, unsigned short height,
+                Canvas* parent = nullptr);
+  explicit StandardPanel(const GlobCreationInfo& info);
+  ~StandardPanel() override;
+
+  // --- Virtual operations, in slot order ---
+  void setCol(const Colour& colour, bool redraw) override;
+  virtual void set_size_flag(size_state state);
+  WString getMenuTitle() override { return title_; }
+  virtual void setBorderStyle(UifTypeOfBorder border);
+  virtual void setMinSize(unsigned width, unsigned height);
+  virtual void setTitle(const WString& title);
+  virtual XY<int> getOriginXY(CoordinateOrigin origin) const;
+  virtual Kw::Box<int> getUserArea() const;
+  // Messages that the panel does not handle itself; 1 consumes, 0 passes on to the base.
+  virtual int handleMessageEvent(const String& msg, Glob* sender) { return 0; }
+  // Key presses other than Tab and Shift+Tab, with their modifier bits; 1 consumes.
+  virtual int handleKeyboardEvent(int keyCode) { return 0; }
+  virtual int handleMouseEvent(Event* e) { return 0; }
+  // The close button was pressed. Returning false consumes the message; true passes it on.
+  virtual bool handlePoot() { return true; }
+  // The size button was pressed; the default flips between the full and the minimised size.
+  virtual void handleFlipSize();
+  virtual int handleTimerEvent() { return 0; }
+  // The title box changed the title (already stored).
+  virtual void handleTitleChange() {}
+  // The live children of the widget list, in list order.
+  virtual void getChildren(std::vector<Glob*>& out) const;
+  virtual void drawBackground();
+  virtual void drawBorder();
+  virtual void drawWidgets();
+  virtual void handleWidgetAdded(const WidgetDetails& details) {}
+
+  // --- Glob ---
+  int react(Event* e) override;
+  void draw() override;
+  void reshape() override;
+  void reshape_canvas(int x, int y, int width, int height) override;
+  const char* idstring() const override { return "standard_panel"; }
+
+  // --- Layout queries; the static forms work from a frame description ---
+  static XY<int> getOriginXY(CoordinateOrigin origin, int flags, XY<int> size,
+                             UifTypeOfBorder border);
+  static Kw::Box<int> getUserArea(int flags, XY<int> size, UifTypeOfBorder border);
+  static int calcBorderSize(UifTypeOfBorder border) { return PanelGeometry::borderSize(border); }
+  PanelFrame frame() const;
+  UifTypeOfBorder getBorderStyle() const { return border_; }
+  XY<int> getMinSize() const { return minSize_; }
+  void resetMinSize() { minSize_ = XY<int>(); }
+  const WString& getTitleW() const { return title_; }
+  String getTitle() const { return Kw::toUtf8(title_); }
+
+  // --- Children ---
+  // Adds `widget` (moving it onto this panel's canvas if it is elsewhere) at `pos` from
+  // `origin`. False for a null or deleted widget, the panel itself or one of its ancestors, a
+  // widget already in the list, or an origin outside the eight.
+  bool addWidget(Glob* widget, XY<int> pos, CoordinateOrigin origin = OriginBottomLeft,
+                 WidgetSurround surround = SurroundNone, Glob* insertAfter = nullptr);
+  bool addWidget(Glob* widget, int x, int y, CoordinateOrigin origin = OriginBottomLeft,
+                 WidgetSurround surround = SurroundNone, Glob* insertAfter = nullptr);
+  // Adds `widget` `gap` pixels from `reference`, which must already be in the list. Also
+  // false for an alignment across the relation or a relation outside the four.
+  bool addWidgetRelative(Glob* widget, Glob* reference, unsigned gap, WidgetRelativity relativity,
+                         WidgetSurround surround = SurroundNone,
+                         WidgetAlignment alignment = AlignCentre);
+  // Takes the widget out of the list (and the tab order); deletes it when `destroy` is set
+  // and it is still alive. A widget already deleted can be removed by its old address.
+  bool removeWidget(Glob* widget, bool destroy);
+  bool setWidgetPos(Glob* widget, XY<int> pos);
+  bool setWidgetPos(Glob* widget, XY<int> pos, CoordinateOrigin origin);
+  // Moves the widget by (dx, dy), x rightward and y upward whatever its origin.
+  bool translateWidgetPos(Glob* widget, int dx, int dy);
+  bool setWidgetBorderStyle(Glob* widget, WidgetSurround surround);
+  const WidgetDetails* getWidget(const Glob* widget) const;
+  const WidgetDetails* getWidget(unsigned index) const;
+  unsigned numWidgets() const { return static_cast<unsigned>(widgets_.size()); }
+  bool isChildWidget(const Glob* widget) const;
+  // Places every child again (after a change the panel cannot see, such as a child's resize).
+  void recalculateWidgetPositions();
+
+  // --- Tab order ---
+  TabOrderManager& tabOrder() { return tabOrder_; }
+  // Move to the next / previous stop, wrapping round; false when there is no stop to go to.
+  bool incrementTab();
+  bool decrementTab();
+
+  // --- Standard widgets ---
+  void addStandardWidgets(int flags);
+  // Clears the flags and deletes their widgets; `redraw` repaints the panel afterwards.
+  void removeStandardWidgets(int flags, bool redraw);
+  int getStandardWidgetFlags() const { return stdFlags_; }
+  void positionStandardWidgets();
+  // The width left for the title box between the left border and the title buttons.
+  int calcMaxTitleWidgetWidth() const;
+  // The title box, or null.
+  PanelTitleBox* titleBox() const;
+  static void setTitleBoxFactory(PanelTitleBoxFactory factory);
+
+  // --- Size, pinning and modal display ---
+  size_state getSizeState() const { return sizeState_; }
+  bool isDismissable() const { return dismissable_; }
+  bool isPinned() const { return !dismissable_; }
+  void setDismissable(bool dismissable);
+  // Adds (true) or removes (false) one level of modal display; returns the depth afterwards.
+  int setModal(bool modal);
+  int getModalDepth() const { return modalDepth_; }
+  bool isModal() const { return modalDepth_ > 0; }
+  // The shade behind the panel while modal, or null.
+  Glob* modalShade() const;
+
+ protected:
+  // A standard title widget, or null: for subclasses that restyle them.
+  Glob* standardWidget(StandardWidgetFlag flag) const;
+
+ private:
+  struct StandardWidgets;
+  static constexpr int kTitleMargin = 5;  // from the border to the outermost title widget
+  static constexpr int kTitleGap = 2;     // between neighbouring title widgets
+  static constexpr unsigned short kTitleBoxHeight = 20;
+
+  void init();
+  void placeWidget(WidgetDetails& d);
+  // The widget's box grown by its surround ring, where it stands now.
+  Kw::Box<int> outerBoxOf(const WidgetDetails& d) const;
+  WidgetDetails* findLive(const Glob* widget);
+  const WidgetDetails* findLive(const Glob* widget) const;
+  // A live entry, else the entry of a deleted child that had this address.
+  WidgetDetails* findAny(const Glob* widget);
+  bool ownsCanvasOf(const Glob* widget) const;
+  bool isAncestorOrSelf(const Glob* g) const;
+  bool canAdopt(Glob* widget) const;
+  WidgetDetails& insertDetails(const WidgetDetails& d, Glob* insertAfter);
+  void makeAbsolute(WidgetDetails& d);
+  void joinTabOrder(Glob* widget, Glob* insertAfter);
+  int reactToMessage(Event* e);
+  void enterModal();
+  void leaveModal();
+  void applySizeState(size_state state);
+  void createTitleBox(int flags);
+  // The left edge of the title buttons (less the gap), or the right end of the strip.
+  int titleButtonsLeft() const;
+  void syncSizeButton();
+  void syncPinButton();
+
+  UifTypeOfBorder border_ = UifBorderNone;
+  int stdFlags_ = 0;
+  std::vector<WidgetDetails> widgets_;
+  XY<int> minSize_;
+  WString title_;
+  TabOrderManager tabOrder_;
+  std::unique_ptr<StandardWidgets> std_;
+
+  // Size.
+  size_state sizeState_ = SizeFull;
+  int fullHeight_ = 0;
+  std::vector<GlobHandle<>> hiddenByMinimise_;
+
+  // Pinning and modal display.
+  bool dismissable_ = false;
+  int modalDepth_ = 0;
+  bool savedDismissable_ = false;
+  bool savedPinActive_ = true;
+  GlobHandle<> modalPin_;
+  GlobHandle<ModalShade> shade_;
+};
