@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <climits>
+#include <string>
 
 #include "panels/ModalShade.h"
 #include "platform/glob/RootGlob.h"
@@ -37,10 +38,21 @@ unsigned short toDimension(int v) {
   return static_cast<unsigned short>(std::clamp(v, 0, 0xFFFF));
 }
 
+// A size from the record; one that is no 16-bit size is refused in favour of the default.
+unsigned short dimensionFromConfig(const configb& config, const char* key, unsigned short def) {
+  const int v = config_int(config, key, def);
+  if (v >= 0 && v <= 0xFFFF) return static_cast<unsigned short>(v);
+  if (config.firstReportOf(key, config.get(key))) {
+    diagWarning(String("StandardPanel: ") + key + " " + std::to_string(v) +
+                " is no panel size; using " + std::to_string(def) + "\n");
+  }
+  return def;
+}
+
 GlobCreationInfo infoFromConfig(const configb& config, unsigned short width, unsigned short height,
                                 Canvas* parent) {
-  GlobCreationInfo info(toDimension(config_int(config, "width", width)),
-                        toDimension(config_int(config, "height", height)),
+  GlobCreationInfo info(dimensionFromConfig(config, "width", width),
+                        dimensionFromConfig(config, "height", height),
                         parent ? parent : screenCanvas());
   info.x = config_int(config, "x", 0);
   info.y = config_int(config, "y", 0);
