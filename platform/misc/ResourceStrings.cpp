@@ -94,6 +94,7 @@ void ResourceStrings::loadText(std::string_view text, const String& origin) {
 WString ResourceStrings::lookup(unsigned int id) const {
   const auto it = table_.find(id);
   if (it != table_.end()) return it->second;
+  if (fallback_ && fallback_ != this && fallback_->contains(id)) return fallback_->lookup(id);
   if (reported_.insert(id).second) {
     diagWarning("ResourceStrings: missing string " + std::to_string(id));
   }
@@ -110,6 +111,10 @@ WString ResourceStrings::placeholder(unsigned int id) {
 }
 
 ResourceStrings& resourceStrings() {
-  static ResourceStrings table;
+  static ResourceStrings table = [] {
+    ResourceStrings t;
+    t.setFallback(&libraryStrings());
+    return t;
+  }();
   return table;
 }

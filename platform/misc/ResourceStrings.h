@@ -8,8 +8,9 @@
 // Invalid UTF-8 in a text is kept with U+FFFD in place of each bad sequence, and reported. When
 // an id appears twice, the first text is kept and the later line is reported and skipped.
 //
-// Looking up an unknown id gives the visible placeholder "[missing string <id>]" and a
-// diagnostic the first time that id is asked for.
+// Looking up an unknown id asks the table's fallback, if it has one; failing that it gives the
+// visible placeholder "[missing string <id>]" and a diagnostic the first time that id is asked
+// for.
 #include <map>
 #include <set>
 #include <string_view>
@@ -29,15 +30,23 @@ class ResourceStrings {
   bool contains(unsigned int id) const { return table_.count(id) != 0; }
   WString lookup(unsigned int id) const;
   std::size_t size() const { return table_.size(); }
+  // Empties the table; the fallback stays.
   void clear();
+  // The table asked for ids this one lacks (null for none). It must outlive this table.
+  void setFallback(const ResourceStrings* fallback) { fallback_ = fallback; }
 
   static WString placeholder(unsigned int id);
 
  private:
   std::map<unsigned int, WString> table_;
+  const ResourceStrings* fallback_ = nullptr;
   // Ids already reported missing.
   mutable std::set<unsigned int> reported_;
 };
 
-// The application's string table, empty until the application loads one.
+// The application's string table, empty until the application loads one. Its fallback is
+// libraryStrings(), so that the library's own texts show even when the application's table
+// lacks them.
 ResourceStrings& resourceStrings();
+// The library's default texts (LibraryStrings.cpp).
+const ResourceStrings& libraryStrings();
