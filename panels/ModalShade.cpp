@@ -1,5 +1,7 @@
 #include "panels/ModalShade.h"
 
+#include "platform/glib/Painter.h"
+
 ModalShade::ModalShade(Glob& screen, const Colour& colour)
     : Glob(GlobCreationInfo(screen.width(), screen.height(), screen.canvas())), colour_(colour) {}
 
@@ -8,4 +10,7 @@ int ModalShade::react(Event* e) {
   return Glob::react(e);
 }
 
-void ModalShade::draw() {}
+void ModalShade::draw() {
+  Glib::Painter p(*canvas());
+  p.fillRect(p.bounds(), colour_);
+}

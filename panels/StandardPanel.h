@@ -74,6 +74,7 @@ class StandardPanel : public rect {
   void setCol(const Colour& colour, bool redraw) override;
   virtual void set_size_flag(size_state state);
   WString getMenuTitle() override { return title_; }
+  void setcol(const Colour& colour, bool redraw) override;
   virtual void setBorderStyle(UifTypeOfBorder border);
   virtual void setMinSize(unsigned width, unsigned height);
   virtual void setTitle(const WString& title);
