@@ -105,6 +105,7 @@ class StandardPanel : public rect {
   void reshape() override;
   void reshape_canvas(int x, int y, int width, int height) override;
   const char* idstring() const override { return "standard_panel"; }
+  String describeValue() const override { return getTitle(); }
 
   // --- Layout queries; the static forms work from a frame description ---
   static XY<int> getOriginXY(CoordinateOrigin origin, int flags, XY<int> size,
