@@ -93,14 +93,6 @@ XY<int> PanelGeometry::placeFromOrigin(CoordinateOrigin origin, XY<int> pos, XY<
   return {x, y};
 }
 
-XY<int> PanelGeometry::offsetFromOrigin(CoordinateOrigin origin, XY<int> corner, XY<int> widgetSize,
-                                        const PanelFrame& frame) {
-  const XY<int> o = originXY(origin, frame);
-  const int x = isRightOrigin(origin) ? o.x - corner.x - widgetSize.x : corner.x - o.x;
-  const int y = isTopOrigin(origin) ? o.y - corner.y - widgetSize.y : corner.y - o.y;
-  return {x, y};
-}
-
 XY<int> PanelGeometry::translateOffset(CoordinateOrigin origin, XY<int> pos, int dx, int dy) {
   return {isRightOrigin(origin) ? pos.x - dx : pos.x + dx,
           isTopOrigin(origin) ? pos.y - dy : pos.y + dy};

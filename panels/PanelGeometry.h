@@ -59,9 +59,6 @@ class PanelGeometry {
   // The bottom-left corner of a widget of `widgetSize` placed at `pos` from `origin`.
   static XY<int> placeFromOrigin(CoordinateOrigin origin, XY<int> pos, XY<int> widgetSize,
                                  const PanelFrame& frame);
-  // The inverse: the position from `origin` of a widget whose bottom-left corner is `corner`.
-  static XY<int> offsetFromOrigin(CoordinateOrigin origin, XY<int> corner, XY<int> widgetSize,
-                                  const PanelFrame& frame);
   // A move by (dx, dy) in panel axes, as a change of the position from `origin`.
   static XY<int> translateOffset(CoordinateOrigin origin, XY<int> pos, int dx, int dy);
 

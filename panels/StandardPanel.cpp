@@ -4,12 +4,18 @@
 #include <climits>
 #include <string>
 
+#include "buttons/Button.h"
+#include "buttons/PinButton.h"
+#include "buttons/PootButton.h"
+#include "buttons/SettingsButton.h"
+#include "buttons/SizeButton.h"
 #include "panels/ModalShade.h"
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/misc/Config.h"
 #include "platform/misc/Diagnostics.h"
+#include "platform/misc/UIString.h"
 #include "platform/misc/configb.h"
 
 const char* const StandardPanel::doItMsg = "do_it";
@@ -17,7 +23,13 @@ const char* const StandardPanel::titleChangedMsg = "StdPanelTitleChanged";
 
 namespace {
 
-constexpr int kShadeAlpha8 = 150;  // how much of the screen the modal shade hides, of 255
+constexpr int kShadeAlpha8 = 150;
+constexpr unsigned short kTitleButtonSize = 20;
+constexpr unsigned short kPinWidth = 16;
+constexpr unsigned short kPinHeight = 20;
+constexpr unsigned short kDoItWidth = 80;
+constexpr unsigned short kDoItHeight = 22;
+constexpr unsigned kDoItLabelId = 41;  // how much of the screen the modal shade hides, of 255
 
 PanelTitleBoxFactory& titleBoxFactory() {
   static PanelTitleBoxFactory factory;
@@ -69,11 +81,11 @@ bool startsWith(const String& s, const char* prefix) {
 
 // The title widgets the panel owns, each present only while its flag is set.
 struct StandardPanel::StandardWidgets {
-  GlobHandle<> poot;
-  GlobHandle<> settings;
-  GlobHandle<> size;
-  GlobHandle<> pin;
-  GlobHandle<> doIt;
+  GlobHandle<PootButton> poot;
+  GlobHandle<SettingsButton> settings;
+  GlobHandle<SizeButton> size;
+  GlobHandle<PinButton> pin;
+  GlobHandle<Button> doIt;
   GlobHandle<> titleGlob;
   std::unique_ptr<PanelTitleBox> title;
 
@@ -527,9 +539,49 @@ Glob* StandardPanel::standardWidget(StandardWidgetFlag flag) const {
 void StandardPanel::addStandardWidgets(int flags) {
   flags &= kStdAllFlags;
   stdFlags_ |= flags;
-  createTitleBox(flags);
+  createStandardButtons(stdFlags_);
+  createTitleBox(stdFlags_);
   recalculateWidgetPositions();
   update();
+}
+
+void StandardPanel::createStandardButtons(int flags) {
+  Canvas* c = canvas();
+  const Palette& pal = getPalette();
+  // Title buttons take the panel's colours, so that they sit in its title strip.
+  auto restyle = [&pal](Button* b) {
+    b->setPalette(pal);
+    b->setcols(pal.get(Palette::WindowText), pal.windowShade(4));
+  };
+  if ((flags & StdPootButton) && !std_->poot) {
+    auto* b = new PootButton(kTitleButtonSize, 0, c);
+    restyle(b);
+    std_->poot = b;
+  }
+  if ((flags & StdSizeButton) && !std_->size) {
+    auto* b = new SizeButton(sizeState_ == SizeMinimised, kTitleButtonSize, 0, c);
+    restyle(b);
+    std_->size = b;
+  }
+  if ((flags & StdPinButton) && !std_->pin) {
+    auto* b = new PinButton(kPinWidth, kPinHeight, c);
+    restyle(b);
+    b->setTransparentBackground(true);
+    // A latching button reports its message + " on" / " off": "pin on" pins the panel.
+    b->set_message("pin");
+    b->set_state(isPinned() ? kButtonDown : kButtonUp, false);
+    std_->pin = b;
+  }
+  if ((flags & StdSettingsButton) && !std_->settings) {
+    auto* b = new SettingsButton(kTitleButtonSize, 0, c);
+    restyle(b);
+    b->setTransparentBackground(true);
+    std_->settings = b;
+  }
+  if ((flags & StdDoItButton) && !std_->doIt) {
+    std_->doIt =
+        new Button(UIString(kDoItLabelId).toWString(), doItMsg, kDoItWidth, kDoItHeight, 0, c);
+  }
 }
 
 void StandardPanel::createTitleBox(int flags) {
@@ -551,7 +603,7 @@ void StandardPanel::removeStandardWidgets(int flags, bool redraw) {
   flags &= stdFlags_;
   if (!flags) return;
   stdFlags_ &= ~flags;
-  auto drop = [](GlobHandle<>& h) {
+  auto drop = [](auto& h) {
     if (Glob* g = h.get()) delete g;
     h.reset();
   };
@@ -572,7 +624,9 @@ void StandardPanel::removeStandardWidgets(int flags, bool redraw) {
 int StandardPanel::titleButtonsLeft() const {
   const int right = width() - calcBorderSize(border_) - kTitleMargin;
   int left = right;
-  for (Glob* g : {std_->poot.get(), std_->size.get(), std_->pin.get(), std_->settings.get()}) {
+  const Glob* buttons[] = {std_->poot.get(), std_->size.get(), std_->pin.get(),
+                           std_->settings.get()};
+  for (const Glob* g : buttons) {
     if (g && ownsCanvasOf(g)) left = std::min(left, g->canvas()->rect().x0 - kTitleGap);
   }
   return left;
@@ -629,7 +683,11 @@ void StandardPanel::positionStandardWidgets() {
   }
 }
 
-void StandardPanel::syncSizeButton() {}
+void StandardPanel::syncSizeButton() {
+  SizeButton* b = std_->size.get();
+  const bool minimised = sizeState_ == SizeMinimised;
+  if (b && b->get_size() != minimised) b->set_size(minimised);
+}
 
 // --- Pinning and modal display ---
 
@@ -639,7 +697,11 @@ void StandardPanel::setDismissable(bool dismissable) {
   syncPinButton();
 }
 
-void StandardPanel::syncPinButton() {}
+void StandardPanel::syncPinButton() {
+  PinButton* b = std_->pin.get();
+  const button_state shown = isPinned() ? kButtonDown : kButtonUp;
+  if (b && b->get_state() != shown) b->set_state(shown, true);
+}
 
 Glob* StandardPanel::modalShade() const {
   return shade_.get();

@@ -36,6 +36,9 @@
 //   setModal(false) at depth 0 changes nothing and returns 0. The shade covers the panel's
 //   screen; the panel's top-level ancestor (the panel itself for a panel on the screen) is
 //   raised above it. A panel on no screen counts depth but shows no shade.
+// - The pin button latches and is given the message "pin", so that it reports "pin on" and
+//   "pin off"; it is kept down while the panel is pinned. The title buttons take the panel's
+//   palette; the do-it button keeps the standard button look.
 // - "StdPanelTitleChanged" and "pin on"/"pin off" are handled as such only while the panel has
 //   a title box or a pin button; otherwise they reach handleMessageEvent like any message.
 #include <memory>
@@ -205,6 +208,7 @@ class StandardPanel : public rect {
   void enterModal();
   void leaveModal();
   void applySizeState(size_state state);
+  void createStandardButtons(int flags);
   void createTitleBox(int flags);
   // The left edge of the title buttons (less the gap), or the right end of the strip.
   int titleButtonsLeft() const;

@@ -45,9 +45,6 @@ TEST(PanelGeometry, EightOriginsWithAndWithoutStrips) {
       {StdPootButton | StdDoItButton, OriginInnerTopRight, {194, 68}},
       // Every title flag makes the title strip; only the do-it flag the bottom one.
       {StdSettingsButton, OriginInnerTopLeft, {6, 68}},
-      {StdSizeButton, OriginInnerTopLeft, {6, 68}},
-      {StdPinButton, OriginInnerTopLeft, {6, 68}},
-      {StdTitleBox, OriginInnerTopLeft, {6, 68}},
       {StdEditableTitleBox, OriginInnerTopLeft, {6, 68}},
       {StdDoItButton, OriginInnerTopLeft, {6, 94}},
       {StdTitleBox, OriginInnerBottomLeft, {6, 6}},
@@ -75,30 +72,6 @@ TEST(PanelGeometry, FramedBorderWithCloseAndDoItLeavesInsetsOf10_36_37) {
   EXPECT_TRUE(
       PanelGeometry::userArea(frameOf(StdPootButton | StdDoItButton, 15, 40, UifBorderFramed))
           .empty());
-}
-
-TEST(PanelGeometry, OffsetsPointIntoThePanelFromEveryOrigin) {
-  const PanelFrame f = frameOf(StdPootButton, 200, 100, UifBorderRaised);
-  const XY<int> size(30, 20);
-  struct Case {
-    CoordinateOrigin origin;
-    XY<int> corner;  // bottom-left of the widget at offset (4, 3)
-  };
-  const Case cases[] = {
-      {OriginBottomLeft, {4, 3}},         {OriginTopLeft, {4, 77}},
-      {OriginBottomRight, {166, 3}},      {OriginTopRight, {166, 77}},
-      {OriginInnerBottomLeft, {9, 8}},    {OriginInnerTopLeft, {9, 46}},
-      {OriginInnerBottomRight, {161, 8}}, {OriginInnerTopRight, {161, 46}},
-  };
-  for (const Case& c : cases) {
-    EXPECT_EQ(PanelGeometry::placeFromOrigin(c.origin, {4, 3}, size, f), c.corner) << c.origin;
-    EXPECT_EQ(PanelGeometry::offsetFromOrigin(c.origin, c.corner, size, f), XY<int>(4, 3))
-        << c.origin;
-    // A move right and up is a move of the same size in screen terms from any origin.
-    const XY<int> moved = PanelGeometry::translateOffset(c.origin, {4, 3}, 7, -2);
-    EXPECT_EQ(PanelGeometry::placeFromOrigin(c.origin, moved, size, f), c.corner + XY<int>(7, -2))
-        << c.origin;
-  }
 }
 
 TEST(PanelGeometry, RelativePlacementForEachRelationAndAlignment) {
@@ -130,14 +103,4 @@ TEST(PanelGeometry, RelativePlacementForEachRelationAndAlignment) {
   EXPECT_EQ(PanelGeometry::placeRelative(ref, {37, 6}, 0, PlaceAbove, AlignCentre).x0, 101);
   // A huge gap is clamped, not wrapped round to a negative one.
   EXPECT_GT(PanelGeometry::placeRelative(ref, size, 0xFFFFFFFFu, PlaceRightOf, AlignTop).x0, 140);
-}
-
-TEST(PanelGeometry, AlignmentsMustRunAcrossTheRelation) {
-  EXPECT_TRUE(PanelGeometry::alignmentFits(PlaceAbove, AlignLeft));
-  EXPECT_TRUE(PanelGeometry::alignmentFits(PlaceBelow, AlignRight));
-  EXPECT_TRUE(PanelGeometry::alignmentFits(PlaceLeftOf, AlignTop));
-  EXPECT_TRUE(PanelGeometry::alignmentFits(PlaceRightOf, AlignBottom));
-  EXPECT_TRUE(PanelGeometry::alignmentFits(PlaceRightOf, AlignCentre));
-  EXPECT_FALSE(PanelGeometry::alignmentFits(PlaceAbove, AlignTop));
-  EXPECT_FALSE(PanelGeometry::alignmentFits(PlaceRightOf, AlignLeft));
 }

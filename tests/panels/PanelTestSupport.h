@@ -30,6 +30,7 @@ class Child : public Glob {
 class RecordingPanel : public StandardPanel {
  public:
   using StandardPanel::StandardPanel;
+  using StandardPanel::standardWidget;
 
   bool handlePoot() override {
     calls.push_back("poot");
