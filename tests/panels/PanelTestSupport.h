@@ -34,8 +34,10 @@ class RecordingPanel : public StandardPanel {
 
   bool handlePoot() override {
     calls.push_back("poot");
-    if (onPoot) onPoot();
-    return pootPassesOn;
+    // onPoot may delete this panel: nothing of it is touched afterwards.
+    const bool answer = pootPassesOn;
+    if (auto action = onPoot) action();
+    return answer;
   }
   void handleFlipSize() override {
     calls.push_back("flip");
