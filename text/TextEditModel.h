@@ -29,6 +29,7 @@
 //     selection afterwards.
 #include <cstdint>
 #include <string_view>
+#include <utility>
 
 #include "platform/kw/String.h"
 #include "text/EditHistory.h"
@@ -152,6 +153,8 @@ class TextEditModel {
   WString cut();
   bool undo();
   bool redo();
+  // Records an edit made elsewhere (it clears the redo list, as every new edit does).
+  void addUndoItem(EditHistory::Item item) { history_.record(std::move(item)); }
   bool canUndo() const { return history_.canUndo(); }
   bool canRedo() const { return history_.canRedo(); }
   // Restores the saved text with everything selected. False with nothing saved.

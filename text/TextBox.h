@@ -1,0 +1,165 @@
+#pragma once
+// The single-line text entry: a text box with horizontal scrolling, selection by keyboard and
+// mouse, the clipboard, word-wise undo and redo, a hidden-text (password) display and a ghost
+// label, telling its owner of editing through the callback events of TextBoxBase.
+//
+// Choices made here:
+// - eCursorPos names the two ends of the text: CursorAtStart and CursorAtEnd.
+// - InitArgs carries the creation record and every setting below; its defaults are those of
+//   the (width, height, palette, canvas) constructor: editable, left-aligned, margins of
+//   kDefaultMargin, the standard font, no limit, no filter, no ghost label, plain display.
+// - The size limit follows the editing model: a typed character is refused when the text,
+//   less what the character replaces (the selection, or in overwrite mode the character after
+//   the caret), already has the limit's length. A paste that starts short of the limit goes in
+//   whole.
+// - Undo history: a new edit clears the redo list; the undo list keeps the newest
+//   EditHistory::kDepth edits (one per typed character). setText clears both lists, so undo
+//   after setText does nothing.
+// - Text that is wider than the visible stretch starts at the left margin whatever the
+//   alignment, and scrolls; alignment applies only to text that fits. The scroll offset moves
+//   only as far as needed to keep the caret in the stretch, and never further than shows the
+//   end of the text at the right margin.
+// - Shortcuts and Escape keep the selection they leave; the caret keys collapse or extend it.
+// - Copy with nothing to copy leaves the clipboard alone. In obfuscated display the box puts
+//   nothing on the clipboard: copy does nothing, and cut only erases.
+// - Only the left button edits; presses with Ctrl or Alt held, and chords, are left to the
+//   owner. A press on a box without the keyboard focus gives it the focus, which selects
+//   everything; a drag from there selects from the start to the pointer.
+// - The box registers nothing with a global service while it holds the focus.
+// - Drawing: a sunken well in the base colour, the text clipped to the stretch between the
+//   margins, the selection in the highlight colour, the ghost label in the ghost colour and
+//   the standard font, and a one-pixel frame in the focus colour while the box holds the focus.
+//   Only the pieces of text inside the stretch are drawn (see TextRuler).
+#include <cstdint>
+
+#include "platform/glib/TextAlignment.h"
+#include "platform/kw/NumRange.h"
+#include "text/TextBoxBase.h"
+#include "text/TextRuler.h"
+
+namespace Glib {
+class Painter;
+}
+
+class TextBox : public TextBoxBase {
+ public:
+  enum eCursorPos : int { CursorAtStart = 0, CursorAtEnd = 1 };
+
+  static constexpr double kSecondClickMs = 400.0;
+  static constexpr unsigned char kDefaultMargin = 4;
+  static constexpr wchar_t kObfuscationChar = L'*';
+  static constexpr const char* kObfuscationFace = "courier";
+
+  struct InitArgs {
+    GlobCreationInfo info;
+    WString text;
+    bool editable = true;
+    TextAlignment alignment = TextAlignment::Left;
+    unsigned char leftMargin = kDefaultMargin;
+    unsigned char rightMargin = kDefaultMargin;
+    Glib::FontDesc font;
+    std::uint64_t sizeLimit = 0;
+    WString characters;
+    CharacterRestriction restriction = NoRestriction;
+    WString ghostLabel;
+    bool obfuscated = false;
+  };
+
+  explicit TextBox(const InitArgs& args);
+  TextBox(unsigned short width, unsigned short height, const Palette& palette, Canvas* parent);
+
+  // --- Contents ---
+  void setText(const WString& text);
+  const WString& getText() const { return model_.text(); }
+  WString getString() const override { return model_.text(); }
+  void setString(const WString& text) override { setText(text); }
+  bool isEmpty() const override { return model_.isEmpty(); }
+  bool getChanged() const override { return model_.getChanged(); }
+  WString getSelectedText() const override { return model_.selectedText(); }
+
+  // --- Caret and selection ---
+  void setSelection(NumRange<int, true> range);
+  void highlightAllText(bool on) override;
+  void setCursorPosition(eCursorPos pos);
+  void setCursorPosition(unsigned short index);
+
+  // --- Display ---
+  void setAlignment(TextAlignment alignment);
+  TextAlignment getAlignment() const { return alignment_; }
+  void setMargins(unsigned char left, unsigned char right);
+  void setObfuscatedDisplay(bool on);
+  bool isObfuscatedDisplay() const { return obfuscated_; }
+  // Where the text starts (alignment), and how far it is scrolled left, in pixels.
+  int textX() const { return textX_; }
+  int scrollOffset() const { return scrollOffset_; }
+  // The caret's x in the box (text x plus caret x less the scroll offset).
+  int caretDisplayX() const;
+  const TextRuler& ruler() const { return ruler_; }
+  // The font the text is shown in (the obfuscation face in obfuscated display).
+  Glib::FontPtr displayFont() const;
+  bool isGhostLabelVisible() const;
+  WString getDisplayText() const;
+
+  // --- Glob ---
+  void draw() override;
+  void reshape() override;
+  void resize(double width, double height);
+  void handle_kbd_focus() override;
+  int handleKeyboardEvent(int keyCode) override;
+  int handleMouseEvent(Event* e) override;
+  bool isAllowed(wchar_t ch) const override;
+  const char* idstring() const override { return "textbox"; }
+
+  // The time of the last click on any box that is not editable; shared by all text boxes.
+  static double lastReadOnlyClickTime();
+
+ protected:
+  void addCharacter(int ch) override;
+  void paste(const WString& s) override;
+  void copy() override;
+  void cut() override;
+  void undo() override;
+  void redo() override;
+  bool erase(CharPos from, CharPos to, bool undoable);
+  bool eraseSelectedText(bool undoable);
+  WString getText(CharPos from, CharPos to) const override;
+  void updateCurrentPosition(Glib::iFont::eCharSeekMethod method, int index) override;
+  void updateVisibleWindow();
+  void placeCaret();
+  void drawText(Glib::Painter& p);
+  int textXToDisplayX(int64_t x) const;
+  int64_t displayXToTextX(int x) const;
+  // Marks the text area for repainting after the text, caret or selection changed.
+  void invalidateTextSelection();
+  void fontChanged() override;
+
+ private:
+  struct EditState {
+    std::uint64_t revision;
+    int caret, selectionStart, selectionEnd;
+    bool modified;
+    bool operator==(const EditState& o) const = default;
+  };
+
+  void apply(const InitArgs& args);
+  EditState editState() const;
+  // Brings the ruler, the scroll offset and the caret up to date with the model.
+  void relayout();
+  // Lays the text out again and repaints after a change of the model.
+  void changed();
+  int handleEditingKey(unsigned key);
+  void gainFocus();
+  void loseFocus();
+  int stretchWidth() const;
+  int caretY() const;
+
+  TextRuler ruler_;
+  std::uint64_t rulerRevision_ = ~std::uint64_t{0};
+  int scrollOffset_ = 0;
+  int textX_ = kDefaultMargin;
+  unsigned char leftMargin_ = kDefaultMargin;
+  unsigned char rightMargin_ = kDefaultMargin;
+  TextAlignment alignment_ = TextAlignment::Left;
+  bool obfuscated_ = false;
+  bool focused_ = false;
+};
