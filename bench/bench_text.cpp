@@ -1,7 +1,11 @@
-// The text-editing model on its own: typing, pasting and undoing in long texts. The text box
-// will add the relayout of the visible stretch on top of these figures.
+// Typing, pasting and undoing in long texts: the editing model on its own, then the text box
+// with the relayout of what it shows.
 #include <benchmark/benchmark.h>
 
+#include "platform/misc/InProcessClipboard.h"
+#include "platform/misc/WindowsClipboard.h"
+#include "platform/testing/Harness.h"
+#include "text/TextBox.h"
 #include "text/TextEditModel.h"
 
 namespace {
@@ -92,5 +96,102 @@ BENCHMARK(BM_UndoWordAfter100Words)
     ->Arg(1)
     ->Iterations(2000)
     ->Unit(benchmark::kMicrosecond);
+
+}  // namespace
+
+// --- The text box: the model plus the ruler, the scroll offset and the caret ---
+
+namespace {
+
+// A focused 300-pixel box holding `text`, with the caret at the end.
+TextBox* focusedBox(Harness& h, const WString& text) {
+  TextBox::InitArgs args;
+  args.info = h.place(10, 10, 300, 24);
+  args.text = text;
+  auto* box = new TextBox(args);
+  box->set_kbd_focus();
+  h.key(TextEditModel::kKeyEnd);
+  h.pump();
+  return box;
+}
+
+// One key typed at the end of a 10,000-character text, through the screen's key routing, with
+// the relayout of what the box shows (ruler, scroll offset, caret). Arg 1 also repaints the
+// box into the screen's image.
+void BM_TextBoxTypeAtEndOf10k(benchmark::State& state) {
+  Harness h(400, 60);
+  const WString base = sampleText(10000);
+  TextBox* box = focusedBox(h, base);
+  const bool repaint = state.range(0) != 0;
+  if (repaint) h.render();
+  int typed = 0;
+  for (auto _ : state) {
+    h.key(static_cast<unsigned>(L'a' + typed % 26));
+    if (repaint) h.render();
+    if (++typed % 1000 == 0) {
+      state.PauseTiming();
+      box->setText(base);
+      h.pump();
+      state.ResumeTiming();
+    }
+  }
+  benchmark::DoNotOptimize(box->caretDisplayX());
+}
+BENCHMARK(BM_TextBoxTypeAtEndOf10k)->Arg(0)->Arg(1)->Unit(benchmark::kMicrosecond);
+
+// One key typed in the middle of a 10,000-character text: only the pieces round the caret are
+// measured again.
+void BM_TextBoxTypeInMiddleOf10k(benchmark::State& state) {
+  Harness h(400, 60);
+  const WString base = sampleText(10000);
+  TextBox* box = focusedBox(h, base);
+  box->setCursorPosition(static_cast<unsigned short>(5000));
+  int typed = 0;
+  for (auto _ : state) {
+    h.key(static_cast<unsigned>(L'a' + typed % 26));
+    if (++typed % 1000 == 0) {
+      state.PauseTiming();
+      box->setText(base);
+      box->setCursorPosition(static_cast<unsigned short>(5000));
+      state.ResumeTiming();
+    }
+  }
+}
+BENCHMARK(BM_TextBoxTypeInMiddleOf10k)->Unit(benchmark::kMicrosecond);
+
+// Ctrl+V of 100,000 characters over a short selection of a 10,000-character text: the model's
+// paste and the measuring of the whole new line.
+void BM_TextBoxPaste100k(benchmark::State& state) {
+  Harness h(400, 60);
+  InProcessClipboard clipboard;
+  WindowsClipboard::setProvider(&clipboard);
+  const WString base = sampleText(10000);
+  clipboard.setText(sampleText(100000));
+  TextBox* box = focusedBox(h, base);
+  for (auto _ : state) {
+    state.PauseTiming();
+    box->setText(base);
+    box->setSelection(NumRange<int, true>(5000, 5010));
+    state.ResumeTiming();
+    h.key(TextBoxBase::kKeyPaste);
+  }
+  WindowsClipboard::setProvider(nullptr);
+}
+BENCHMARK(BM_TextBoxPaste100k)->Unit(benchmark::kMillisecond);
+
+// One Ctrl+Z after typing 100 words at the end of a 10,000-character text.
+void BM_TextBoxUndoAfter100Words(benchmark::State& state) {
+  Harness h(400, 60);
+  const WString base = sampleText(10000);
+  TextBox* box = focusedBox(h, base);
+  for (auto _ : state) {
+    state.PauseTiming();
+    box->setText(base);
+    for (int w = 0; w < 100; ++w) h.type(w > 0 ? L" quick" : L"quick");
+    state.ResumeTiming();
+    h.key(TextBoxBase::kKeyUndo);
+  }
+}
+BENCHMARK(BM_TextBoxUndoAfter100Words)->Iterations(300)->Unit(benchmark::kMicrosecond);
 
 }  // namespace
