@@ -259,7 +259,7 @@ void TextBoxBase::setActive(bool active, bool redraw) {
 }
 
 MouseCursorID TextBoxBase::contextCursor(const XY<int>&) {
-  return kCursorText;
+  return editable_ ? kCursorText : kCursorArrow;
 }
 
 bool TextBoxBase::reviewMenu(Event*) {

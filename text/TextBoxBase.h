@@ -138,6 +138,7 @@ class TextBoxBase : public StandardPanel, public TabOrderable {
   // --- Glob ---
   int react(Event* e) override;
   void setActive(bool active, bool redraw) override;
+  // The text cursor over an editable box, the arrow over a read-only one.
   MouseCursorID contextCursor(const XY<int>& pos) override;
   bool reviewMenu(Event* e) override;
   const char* idstring() const override { return "textboxbase"; }

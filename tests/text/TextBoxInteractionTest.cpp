@@ -129,23 +129,6 @@ TEST_F(TextBoxFixture, ScrollingKeepsTheCaretVisibleWithTheLeastMovement) {
   EXPECT_EQ(box->scrollOffset(), 0);
 }
 
-TEST_F(TextBoxFixture, AlignmentPlacesTextThatFitsAndWideTextStartsAtTheLeftMargin) {
-  TextBox::InitArgs args;
-  args.text = L"abc";
-  args.alignment = TextAlignment::Right;
-  TextBox* box = makeBox(args, 100);
-  const int w = static_cast<int>(box->ruler().width());
-  EXPECT_EQ(box->textX(), 100 - TextBox::kDefaultMargin - w);
-  box->setAlignment(TextAlignment::Centred);
-  EXPECT_EQ(box->textX(), (100 - w) / 2);
-  box->setMargins(10, 2);
-  box->setAlignment(TextAlignment::Left);
-  EXPECT_EQ(box->textX(), 10);
-  box->setAlignment(TextAlignment::Right);
-  box->setText(WString(60, L'm'));
-  EXPECT_EQ(box->textX(), 10);
-}
-
 TEST_F(TextBoxFixture, ObfuscatedDisplayShowsOneAsteriskPerCharacterInAMonospaceFont) {
   TextBox::InitArgs args;
   args.obfuscated = true;
