@@ -224,7 +224,9 @@ int TextBox::handleMouseEvent(Event* e) {
   if (!isEditable()) {
     if (mouse_down_event(e)) {
       const double t = now();
-      const bool second = t - gLastReadOnlyClick < kSecondClickMs;
+      // A clock that went back (a new manual clock) never makes a second click.
+      const double since = t - gLastReadOnlyClick;
+      const bool second = since >= 0.0 && since < kSecondClickMs;
       gLastReadOnlyClick = t;
       if (second) informOwner(SecondClick, false, 0);
     }
@@ -426,8 +428,9 @@ void TextBox::reshape() {
 
 void TextBox::resize(double width, double height) {
   const Kw::Box<int>& r = canvas()->rect();
-  reshape_canvas(r.x0, r.y0, static_cast<int>(std::max(0.0, width)),
-                 static_cast<int>(std::max(0.0, height)));
+  // NaN and negative sizes become 0; canvases are at most 16-bit.
+  auto size = [](double v) { return static_cast<int>(std::max(0.0, std::min(v, 65535.0))); };
+  reshape_canvas(r.x0, r.y0, size(width), size(height));
 }
 
 // --- Drawing ---

@@ -54,6 +54,35 @@ TEST_F(TextBoxFixture, CallbackRegistrationsAllFireInOrderAndANullHandlerMeansTh
   EXPECT_EQ(owner->count("third"), 2);
 }
 
+namespace {
+
+// Deletes the Glob that sent the message it receives, as an owner closing a dialogue might.
+class Deleter : public Glob {
+ public:
+  using Glob::Glob;
+  int react(Event* e) override {
+    if (message_event(e)) delete event_to_sender_glob(e);
+    return 1;
+  }
+};
+
+}  // namespace
+
+TEST_F(TextBoxFixture, AnOwnerMayDeleteTheBoxFromAnyCallback) {
+  auto* deleter = new Deleter(h.place(300, 100, 10, 10));
+  for (auto event :
+       {TextBoxBase::TextChangedByKey, TextBoxBase::EnterPressed, TextBoxBase::FocusLostChanged}) {
+    TextBox* box = focusedBox(L"");
+    GlobHandle<> alive(box);
+    box->requestCallback("bye", deleter, event);
+    h.type(L"ab");
+    h.key(kEnter);
+    h.pump();
+    EXPECT_FALSE(alive) << event;
+    EXPECT_EQ(get_kbd_focus(), event == TextBoxBase::TextChangedByKey ? nullptr : owner);
+  }
+}
+
 TEST_F(TextBoxFixture, SizeLimitLetsAPasteOverrunThenRefusesTypingWithoutConsumingIt) {
   TextBox::InitArgs args;
   args.sizeLimit = 3;
