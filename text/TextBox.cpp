@@ -333,6 +333,10 @@ WString TextBox::getDisplayText() const {
   return model_.text();
 }
 
+String TextBox::describeValue() const {
+  return Kw::toUtf8(isGhostLabelVisible() ? getGhostLabel() : getDisplayText());
+}
+
 bool TextBox::isGhostLabelVisible() const {
   return model_.isEmpty() && !focused_;
 }

@@ -109,6 +109,8 @@ class TextBox : public TextBoxBase {
   int handleMouseEvent(Event* e) override;
   bool isAllowed(wchar_t ch) const override;
   const char* idstring() const override { return "textbox"; }
+  // What the box shows: its text, asterisks in obfuscated display, else the ghost label.
+  String describeValue() const override;
 
   // The time of the last click on any box that is not editable; shared by all text boxes.
   static double lastReadOnlyClickTime();
