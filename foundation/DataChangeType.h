@@ -6,4 +6,5 @@ enum DataChangeType : int {
   kChangeDragStep = 1,
   kChangeDragRelease = 2,
   kChangeDirect = 3,
+  kChangeUserToggle = 4,  // the user flipped a two-state control (a check box)
 };

@@ -1,0 +1,464 @@
+#include "buttons/Checkbox.h"
+
+#include <algorithm>
+
+#include "platform/glib/FontCache.h"
+#include "platform/glib/Painter.h"
+#include "platform/glib/Symbols.h"
+#include "platform/glob/GlobHandle.h"
+
+namespace {
+
+constexpr unsigned kKeyReturn = 13;
+constexpr unsigned kKeySpace = 32;
+
+GlobCreationInfo infoWithFlag(unsigned short width, unsigned short height, int flag,
+                              Canvas* parent) {
+  GlobCreationInfo info(width, height, parent);
+  info.flags = flag;
+  return info;
+}
+
+// Where a copy goes: the original's parent canvas, place, size and palette.
+GlobCreationInfo placementOf(const Checkbox& b) {
+  const Kw::Box<int>& r = b.canvas()->rect();
+  GlobCreationInfo info(static_cast<unsigned short>(r.width()),
+                        static_cast<unsigned short>(r.height()), b.canvas()->parent(), r.x0, r.y0);
+  info.palette = b.getPalette();
+  return info;
+}
+
+// The colour a box takes from what it is put on.
+Colour backgroundFrom(const Glob& box) {
+  Glob* p = box.parent();
+  if (!p) return box.getPalette().windowShade(3);
+  if (const auto* r = dynamic_cast<const rect*>(p)) return r->getcol();
+  return p->getPalette().get(Palette::Window);
+}
+
+Kw::Box<int> inset(const Kw::Box<int>& b, int dx, int dy) {
+  return Kw::Box<int>(b.x0 + dx, b.y0 + dy, b.x1 - dx, b.y1 - dy);
+}
+
+}  // namespace
+
+// --- Construction ---
+
+Checkbox::Checkbox(unsigned short width, unsigned short height, bool tick, int flag, Canvas* parent)
+    : StandardPanel(infoWithFlag(width, height, flag, parent)) {
+  init(tick);
+}
+
+Checkbox::Checkbox(const GlobCreationInfo& info, bool tick) : StandardPanel(info) {
+  init(tick);
+}
+
+Checkbox::Checkbox(const CheckboxInitArgs& args)
+    : StandardPanel(static_cast<const GlobCreationInfo&>(args)) {
+  init(args.ticked);
+  applyArgs(args);
+}
+
+Checkbox::Checkbox(const Checkbox& other)
+    : StandardPanel(placementOf(other)), ValWidget<bool>(), TabOrderable() {
+  init(other.ticked);
+  copySettingsFrom(other);
+}
+
+Checkbox::~Checkbox() = default;
+
+void Checkbox::init(bool initialTicked) {
+  ticked = initialTicked;
+  msgPrefix = kDefaultPrefix;
+  appendState = true;
+  msgGeneration = GenerateOnPress;
+  clicksEnabled = true;
+  userFunction = nullptr;
+  userData = nullptr;
+  textColourWhenTicked = getPalette().get(Palette::WindowText);
+  textColour = getPalette().get(Palette::WindowText);
+  appearance = BoxLeft;
+  borderStyle = getBorderStyle();
+  textAlignment = TextAlignment::Left;
+  margin = kDefaultMargin;
+  boldWhenTicked = false;
+  brighten = true;
+  tickCharacter = 0;
+  mouseInside = false;
+  setcol(backgroundFrom(*this), false);
+  setDefaultCursor(kCursorHand);
+}
+
+void Checkbox::applyArgs(const CheckboxInitArgs& args) {
+  label = args.label;
+  msgPrefix = args.msgPrefix;
+  appendState = args.appendState;
+  msgGeneration = args.msgGeneration == GenerateOnRelease ? GenerateOnRelease : GenerateOnPress;
+  if (args.appearance >= BoxLeft && args.appearance <= FlatToggle)
+    appearance = static_cast<Appearance>(args.appearance);
+  setBorderStyle(args.borderStyle);
+  textAlignment = args.textAlignment;
+  if (args.bold) font.style = Glib::FontDesc::Bold;
+  boldWhenTicked = args.boldWhenTicked;
+  clicksEnabled = args.clicksEnabled;
+}
+
+void Checkbox::copySettingsFrom(const Checkbox& other) {
+  label = other.label;
+  font = other.font;
+  msgPrefix = other.msgPrefix;
+  appendState = other.appendState;
+  msgGeneration = other.msgGeneration;
+  clicksEnabled = other.clicksEnabled;
+  textColourWhenTicked = other.textColourWhenTicked;
+  textColour = other.textColour;
+  appearance = other.appearance;
+  setBorderStyle(other.borderStyle);
+  textAlignment = other.textAlignment;
+  margin = other.margin;
+  boldWhenTicked = other.boldWhenTicked;
+  brighten = other.brighten;
+  tickCharacter = other.tickCharacter;
+  setcol(other.getcol(), false);
+  setActive(other.isActive(), false);
+}
+
+Checkbox* Checkbox::make(unsigned short width, unsigned short height, const WString& text,
+                         bool tick, const Colour& colour, Canvas* parent, int flag1, int flag2) {
+  auto* box = new Checkbox(width, height, tick, 0, parent);
+  box->setLabel(text);
+  box->setcol(colour, false);
+  if (flag1) box->font.style = Glib::FontDesc::Bold;
+  if (flag2) box->appearance = FlatToggle;
+  return box;
+}
+
+int Checkbox::indicatorWidth(Appearance a) {
+  return a == FlatToggle ? kToggleWidth : kBoxSize;
+}
+
+unsigned short Checkbox::calcWidth(const WString& text, UifTypeOfBorder border,
+                                   Appearance appearance, bool bold) {
+  Glib::FontDesc desc;
+  if (bold) desc.style = Glib::FontDesc::Bold;
+  const int textWidth = text.empty() ? 0 : Glib::fonts().get(desc)->textWidth(text) + kLabelGap;
+  // One spare pixel on each side of the label keeps the focus mark off the text.
+  const int w = 2 * calcBorderSize(border) + 2 * kDefaultMargin + indicatorWidth(appearance) +
+                textWidth + (text.empty() ? 0 : 2);
+  return static_cast<unsigned short>(std::clamp(w, 0, 0xFFFF));
+}
+
+// --- State ---
+
+void Checkbox::setStateInternal(bool value) {
+  ticked = value;
+}
+
+void Checkbox::setState(bool value) {
+  if (value == ticked) return;
+  setStateInternal(value);
+  update();
+  if (getDataAdaptor() && getDataValue() != value) requestSetNewDataValue(value, kToggleChange);
+}
+
+void Checkbox::setState(bool value, bool notify) {
+  if (notify) {
+    setState(value);
+  } else {
+    setStateInternal(value);
+  }
+}
+
+void Checkbox::requestToggleState() {
+  if (userFunction) {
+    userFunction(this, userData);
+    return;
+  }
+  GlobHandle<Checkbox> self(this);
+  setState(!ticked);
+  // The model's answer may have deleted the box.
+  if (self) sendToggleMessage(appendState);
+}
+
+String Checkbox::toggleMessage(bool withState) const {
+  if (!withState) return msgPrefix;
+  return msgPrefix + (ticked ? kTickedWord : kClearWord);
+}
+
+bool Checkbox::sendToggleMessage(bool withState) {
+  Glob* to = parent();
+  if (!to) return false;
+  Event e(kEventMessage);
+  e.message(toggleMessage(withState));
+  e.setSender(this);
+  e.dest = to;
+  e.canvas = canvas();
+  event_send(&e, false);
+  return true;
+}
+
+void Checkbox::setMsgPrefix(const String& prefix, bool append) {
+  msgPrefix = prefix;
+  appendState = append;
+}
+
+void Checkbox::setUserFunction(UserFunction fn, void* data) {
+  userFunction = fn;
+  userData = data;
+}
+
+// --- Events ---
+
+int Checkbox::react(Event* e) {
+  if (clicksEnabled && mouse_left_event(e) && isActive()) return reactToLeftButton(e);
+  if (e->type == kEventKeyPress && (e->keyCode() == kKeyReturn || e->keyCode() == kKeySpace)) {
+    // Deliberately not gated on isActive(): a focused inactive box still toggles from the keys.
+    requestToggleState();
+    return 1;
+  }
+  return StandardPanel::react(e);
+}
+
+int Checkbox::reactToLeftButton(Event* e) {
+  const bool press = mouse_down_event(e);
+  const bool release = mouse_up_event(e);
+  if ((msgGeneration == GenerateOnPress && press) ||
+      (msgGeneration == GenerateOnRelease && release)) {
+    requestToggleState();
+  }
+  return 1;
+}
+
+void Checkbox::setActive(bool active, bool redraw) {
+  if (active == isActive()) return;
+  StandardPanel::setActive(active, false);
+  if (redraw) update();
+}
+
+void Checkbox::handle_kbd_focus() {
+  update();
+}
+
+void Checkbox::handleMouseContainment(bool inside) {
+  mouseInside = inside;
+  update();
+}
+
+void Checkbox::setBorderStyle(UifTypeOfBorder border) {
+  borderStyle = border;
+  StandardPanel::setBorderStyle(border);
+}
+
+bool Checkbox::isTabStopActive() {
+  return isActive() && canvas_is_mapped_to_root(canvas());
+}
+
+void Checkbox::handleTabStopFocusReceipt() {
+  set_kbd_focus();
+}
+
+void Checkbox::handleTabStopFocusLoss() {
+  if (!hasKeyboardFocus()) return;
+  if (Glob* p = parent()) p->set_kbd_focus();
+}
+
+bool Checkbox::hasKeyboardFocus() const {
+  return get_kbd_focus() == static_cast<const Glob*>(this);
+}
+
+String Checkbox::describeValue() const {
+  return Kw::toUtf8(label) + (ticked ? " [ticked]" : " [clear]");
+}
+
+// --- Look ---
+
+void Checkbox::setLabel(const WString& text) {
+  if (text == label) return;
+  label = text;
+  update();
+}
+
+void Checkbox::setFont(const Glib::FontDesc& desc) {
+  if (desc == font) return;
+  font = desc;
+  update();
+}
+
+void Checkbox::setTextColourWhenTicked(const Colour& c) {
+  if (c == textColourWhenTicked) return;
+  textColourWhenTicked = c;
+  if (ticked) update();
+}
+
+void Checkbox::setTextColour(const Colour& c) {
+  if (c == textColour) return;
+  textColour = c;
+  if (!ticked) update();
+}
+
+void Checkbox::setAppearance(Appearance a) {
+  if (a == appearance || a < BoxLeft || a > FlatToggle) return;
+  appearance = a;
+  update();
+}
+
+void Checkbox::setTextAlignment(TextAlignment a) {
+  if (a == textAlignment) return;
+  textAlignment = a;
+  update();
+}
+
+void Checkbox::setMargin(uint16_t m) {
+  if (m == margin) return;
+  margin = m;
+  update();
+}
+
+void Checkbox::setBoldWhenTicked(bool b) {
+  if (b == boldWhenTicked) return;
+  boldWhenTicked = b;
+  if (ticked) update();
+}
+
+void Checkbox::setTickCharacter(char c) {
+  if (c == tickCharacter) return;
+  tickCharacter = c;
+  if (ticked) update();
+}
+
+Colour Checkbox::textColourFor(bool enabled) const {
+  const Palette p(ticked ? textColourWhenTicked : textColour, getPalette().windowShade(3));
+  return enabled ? p.get(Palette::WindowText) : p.get(Palette::Disabled);
+}
+
+Colour Checkbox::getTextColour() {
+  return textColourFor(isActive());
+}
+
+// --- Layout ---
+
+Kw::Box<int> Checkbox::indicatorBox() const {
+  const int b = calcBorderSize(borderStyle);
+  const Kw::Box<int> inner(b, b, width() - b, height() - b);
+  const int iw = indicatorWidth(appearance);
+  const int ih = std::min(appearance == FlatToggle ? kToggleHeight : kBoxSize, inner.height());
+  const int y0 = inner.y0 + (inner.height() - ih) / 2;
+  const int x0 = appearance == BoxRight ? inner.x1 - margin - iw : inner.x0 + margin;
+  return Kw::Box<int>(x0, y0, x0 + iw, y0 + ih);
+}
+
+Kw::Box<int> Checkbox::labelBox() const {
+  const int b = calcBorderSize(borderStyle);
+  const Kw::Box<int> ind = indicatorBox();
+  if (appearance == BoxRight)
+    return Kw::Box<int>(b + margin + 1, b, ind.x0 - kLabelGap, height() - b);
+  return Kw::Box<int>(ind.x1 + kLabelGap, b, width() - b - margin, height() - b);
+}
+
+// --- Drawing ---
+
+void Checkbox::draw() {
+  drawBackground();
+  drawBorder();
+  drawTickBox();
+  if (ticked) drawTick(true);
+  drawLabel();
+}
+
+void Checkbox::drawBackground() {
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  p.fillRect(p.bounds(), getcol());
+}
+
+void Checkbox::paintIndicatorWell() {
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  const Palette& pal = getPalette();
+  const Kw::Box<int> box = indicatorBox();
+  const bool hover = mouseInside && isActive() && brighten;
+  Colour well = pal.get(Palette::Base);
+  if (hover) well = scale(mix(well, pal.get(Palette::Light), 0.25), 1.1);
+  if (!isActive()) well = mix(well, getcol(), 0.5);
+  const Colour edge =
+      isActive() ? pal.get(Palette::Border) : mix(pal.get(Palette::Border), getcol(), 0.5);
+  if (appearance == FlatToggle) {
+    p.fillRect(box, well);
+    p.outlineRect(box, edge);
+    return;
+  }
+  // A sunken well: dark outline, a shadowed top-left inner ring, a light bottom-right one.
+  p.fillRect(box, well);
+  p.outlineRect(box, edge);
+  const Kw::Box<int> in = inset(box, 1, 1);
+  p.depthBox(in, Glib::Bevel::Sunken, 1, mix(well, pal.get(Palette::Light), 0.5),
+             mix(well, pal.get(Palette::Shadow), 0.8));
+}
+
+void Checkbox::drawTickBox() {
+  paintIndicatorWell();
+  if (appearance != FlatToggle || ticked) return;
+  // The clear switch: its knob at the left end.
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  const Kw::Box<int> box = inset(indicatorBox(), 2, 2);
+  const Colour knob =
+      isActive() ? getPalette().get(Palette::Light) : getPalette().get(Palette::Disabled);
+  p.fillRect(Kw::Box<int>(box.x0, box.y0, box.x0 + box.height(), box.y1), knob);
+}
+
+void Checkbox::drawTick(bool full) {
+  paintIndicatorWell();
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  const Palette& pal = getPalette();
+  const Colour mark = isActive() ? pal.get(Palette::Highlight) : pal.get(Palette::Disabled);
+  const Kw::Box<int> box = indicatorBox();
+  if (appearance == FlatToggle) {
+    const Kw::Box<int> in = inset(box, 2, 2);
+    const int k = in.height();
+    if (full) {
+      p.fillRect(in, mark);
+      p.fillRect(Kw::Box<int>(in.x1 - k, in.y0, in.x1, in.y1), pal.get(Palette::HighlightedText));
+    } else {
+      const int x0 = in.x0 + (in.width() - k) / 2;
+      p.fillRect(Kw::Box<int>(in.x0, in.y0, x0, in.y1), mix(mark, getcol(), 0.5));
+      p.fillRect(Kw::Box<int>(x0, in.y0, x0 + k, in.y1), pal.get(Palette::Light));
+    }
+    return;
+  }
+  if (!full) {
+    const int barHeight = std::max(2, box.height() / 5);
+    const int y0 = box.y0 + (box.height() - barHeight) / 2;
+    p.fillRect(Kw::Box<int>(box.x0 + 3, y0, box.x1 - 3, y0 + barHeight), mark);
+    return;
+  }
+  const Kw::Box<int> glyphBox = inset(box, 1, 1);
+  if (tickCharacter == 0) {
+    p.symbol(Glib::kSymbolTick, glyphBox, mark);
+  } else {
+    const WString ch(1, static_cast<wchar_t>(static_cast<unsigned char>(tickCharacter)));
+    p.text(ch, glyphBox, *Glib::fonts().standard(), mark, TextAlignment::Centred,
+           Glib::TextStyles::Plain);
+  }
+}
+
+void Checkbox::drawLabel() {
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  const Kw::Box<int> box = labelBox();
+  if (!label.empty() && !box.empty()) {
+    Glib::FontDesc desc = font;
+    if (boldWhenTicked && ticked) desc.style = Glib::FontDesc::Bold;
+    p.text(label, box, *Glib::fonts().get(desc), getTextColour(), textAlignment,
+           Glib::TextStyles::Plain);
+  }
+  if (hasKeyboardFocus()) {
+    const Kw::Box<int> ind = indicatorBox();
+    const Kw::Box<int> mark = label.empty()
+                                  ? inset(ind, -2, -2)
+                                  : Kw::Box<int>(std::min(ind.x0, box.x0) - 2, ind.y0 - 2,
+                                                 std::max(ind.x1, box.x1) + 1, ind.y1 + 2);
+    p.focusRect(mark, getPalette().get(Palette::Focus));
+  }
+}

@@ -1,0 +1,207 @@
+#pragma once
+// A labelled tick box bound to a bool. It is a standard panel (border style, child layout, tab
+// order), reports a user toggle to its parent with a message made of a prefix and "TICKED" or
+// "CLEAR", and can hand the decision about a click to a user function instead.
+//
+//   input                                  clicks enabled, active   otherwise
+//   left press   (message generation 0)    toggle + report          panel handling
+//   left release (message generation 1)    toggle + report          panel handling
+//   Return / space                         toggle + report          toggle + report
+//
+// "Toggle + report" is requestToggleState(): with a user function set, only the function runs.
+//
+// Choices made here:
+// - Appearances: BoxLeft (0) draws the tick box at the left with the label to its right;
+//   BoxRight (1) puts the label at the left and the box at the right edge; FlatToggle (2) draws
+//   a flat switch (a track whose knob sits left when clear, right and lit when ticked, in the
+//   middle for the indeterminate mark) with the label to its right.
+// - The tick character 0 (the default) draws the vector tick glyph; any other character is
+//   drawn as text, centred in the box, in the tick colour.
+// - The indeterminate mark (drawTick(false)) is a horizontal bar; it repaints the box first,
+//   so it replaces a tick rather than overlaying it.
+// - make's flag1, when non-zero, makes the label bold; calcWidth's bool asks for the width of
+//   a bold label.
+// - The label is the box's own text (setLabel); the panel title stays free for the panel.
+// - The text colour, when clear, is the palette's window text colour unless setTextColour
+//   changed it.
+// - Copying takes the look and behaviour settings, label and ticked state, not the value
+//   binding, tab stops or user function. The copy goes on the same parent canvas at the same
+//   place.
+// - The box has no dump support, so it is never dumped.
+#include <cstdint>
+
+#include "foundation/DataChangeType.h"
+#include "foundation/TabOrderable.h"
+#include "foundation/ValWidget.h"
+#include "panels/StandardPanel.h"
+#include "platform/glib/FontDesc.h"
+#include "platform/glib/TextAlignment.h"
+
+class Checkbox;
+
+// Everything a check box is made from: where it goes and its settings.
+struct CheckboxInitArgs : GlobCreationInfo {
+  WString label;
+  bool ticked = false;
+  String msgPrefix = "Checkbox ";
+  bool appendState = true;
+  int msgGeneration = 0;  // Checkbox::eMsgGeneration
+  int appearance = 0;     // Checkbox::Appearance
+  UifTypeOfBorder borderStyle = UifBorderNone;
+  TextAlignment textAlignment = TextAlignment::Left;
+  bool bold = false;
+  bool boldWhenTicked = false;
+  bool clicksEnabled = true;
+
+  CheckboxInitArgs() = default;
+  CheckboxInitArgs(const WString& l, bool tick, const GlobCreationInfo& where)
+      : GlobCreationInfo(where), label(l), ticked(tick) {}
+};
+
+class Checkbox : public StandardPanel, public ValWidget<bool>, public TabOrderable {
+ public:
+  enum eMsgGeneration : int { GenerateOnPress = 0, GenerateOnRelease = 1 };
+  enum Appearance : int { BoxLeft = 0, BoxRight = 1, FlatToggle = 2 };
+  using UserFunction = void (*)(Checkbox* box, void* data);
+
+  static constexpr const char* kDefaultPrefix = "Checkbox ";
+  static constexpr const char* kTickedWord = "TICKED";
+  static constexpr const char* kClearWord = "CLEAR";
+  // The change type of a user toggle, as the adaptor sees it.
+  static constexpr DataChangeType kToggleChange = kChangeUserToggle;
+  static constexpr uint16_t kDefaultMargin = 3;
+  static constexpr int kBoxSize = 13;      // the tick box, square
+  static constexpr int kToggleWidth = 26;  // the flat switch's track
+  static constexpr int kToggleHeight = 14;
+  static constexpr int kLabelGap = 5;  // between the indicator and the label
+
+  Checkbox(unsigned short width, unsigned short height, bool ticked, int flag, Canvas* parent);
+  Checkbox(const GlobCreationInfo& info, bool ticked);
+  explicit Checkbox(const CheckboxInitArgs& args);
+  Checkbox(const Checkbox& other);
+  Checkbox& operator=(const Checkbox&) = delete;
+  ~Checkbox() override;
+
+  // Builds a box with a label and face colour. flag1 makes the label bold; flag2 selects the
+  // flat toggle appearance.
+  static Checkbox* make(unsigned short width, unsigned short height, const WString& label,
+                        bool ticked, const Colour& colour, Canvas* parent, int flag1, int flag2);
+  // The width a box needs to show `label` in full with that border and appearance.
+  static unsigned short calcWidth(const WString& label, UifTypeOfBorder border,
+                                  Appearance appearance, bool bold);
+
+  // --- Operations check boxes add, in this order ---
+  // The user asked for a toggle: the user function decides when there is one; otherwise the
+  // state flips and the toggle message goes to the parent, which may delete the box.
+  virtual void requestToggleState();
+  // Shows `value` and, when the bound model holds another value, asks it to take this one.
+  virtual void setState(bool value);
+  // true: the tick; false: the indeterminate mark.
+  virtual void drawTick(bool full);
+  virtual void drawTickBox();
+  virtual Colour getTextColour();
+  virtual void setStateInternal(bool value);
+
+  // Calls setState(value) when `notify`, else only stores the state (no redraw, no request).
+  void setState(bool value, bool notify);
+  bool getState() const { return ticked; }
+
+  // --- Glob and panel ---
+  int react(Event* e) override;
+  void setActive(bool active, bool redraw) override;
+  void handle_kbd_focus() override;
+  void handleMouseContainment(bool inside) override;
+  void setBorderStyle(UifTypeOfBorder border) override;
+  void drawBackground() override;
+  void draw() override;
+  const char* idstring() const override { return "checkbox"; }
+  String describeValue() const override;
+
+  // --- Value: the ticked flag ---
+  bool getWidgetValue() override { return ticked; }
+  void setNewWidgetValue(bool& value) override { setState(value); }
+  void setEnabledState(bool enabled) override { setActive(enabled, true); }
+
+  // --- Tab order ---
+  bool isTabStopActive() override;
+  void handleTabStopFocusReceipt() override;
+  void handleTabStopFocusLoss() override;
+
+  // --- Reporting ---
+  void setMsgPrefix(const String& prefix, bool appendState = true);
+  const String& getMsgPrefix() const { return msgPrefix; }
+  bool getAppendState() const { return appendState; }
+  // The prefix, then the state word when `withState`.
+  String toggleMessage(bool withState) const;
+  // Sends toggleMessage(withState) to the parent as a message event; false with no parent.
+  // The receiver runs before this returns and may delete the box.
+  bool sendToggleMessage(bool withState);
+  void setMessageGeneration(eMsgGeneration generation) { msgGeneration = generation; }
+  eMsgGeneration getMessageGeneration() const { return msgGeneration; }
+  void setClicksEnabled(bool enabled) { clicksEnabled = enabled; }
+  bool getClicksEnabled() const { return clicksEnabled; }
+  void setUserFunction(UserFunction fn, void* data);
+  UserFunction getUserFunction() const { return userFunction; }
+  void* getUserData() const { return userData; }
+
+  // --- Look ---
+  void setLabel(const WString& text);
+  const WString& getLabel() const { return label; }
+  void setFont(const Glib::FontDesc& desc);
+  const Glib::FontDesc& getFont() const { return font; }
+  void setTextColourWhenTicked(const Colour& c);
+  const Colour& getTextColourWhenTicked() const { return textColourWhenTicked; }
+  void setTextColour(const Colour& c);
+  void setAppearance(Appearance a);
+  Appearance getAppearance() const { return appearance; }
+  void setTextAlignment(TextAlignment a);
+  TextAlignment getTextAlignment() const { return textAlignment; }
+  void setMargin(uint16_t m);
+  uint16_t getMargin() const { return margin; }
+  void setBoldWhenTicked(bool b);
+  bool getBoldWhenTicked() const { return boldWhenTicked; }
+  // Whether the box lightens under the pointer.
+  void setBrighten(bool b) { brighten = b; }
+  void setTickCharacter(char c);
+  char getTickCharacter() const { return tickCharacter; }
+  bool isMouseInside() const { return mouseInside; }
+
+  // Where the indicator (tick box or switch track) and the label go, in the box's coordinates.
+  Kw::Box<int> indicatorBox() const;
+  Kw::Box<int> labelBox() const;
+
+ protected:
+  // The text colour over window shade 3 for the given enablement.
+  Colour textColourFor(bool enabled) const;
+  bool hasKeyboardFocus() const;
+  // The well or track, empty, in its hover and enablement look.
+  void paintIndicatorWell();
+  void drawLabel();
+
+ private:
+  void init(bool initialTicked);
+  void applyArgs(const CheckboxInitArgs& args);
+  void copySettingsFrom(const Checkbox& other);
+  int reactToLeftButton(Event* e);
+  static int indicatorWidth(Appearance a);
+
+  bool ticked = false;
+  String msgPrefix;
+  bool appendState = true;
+  eMsgGeneration msgGeneration = GenerateOnPress;
+  bool clicksEnabled = true;
+  UserFunction userFunction = nullptr;
+  void* userData = nullptr;
+  Colour textColourWhenTicked;
+  Colour textColour;
+  Appearance appearance = BoxLeft;
+  UifTypeOfBorder borderStyle = UifBorderNone;
+  TextAlignment textAlignment = TextAlignment::Left;
+  uint16_t margin = kDefaultMargin;
+  bool boldWhenTicked = false;
+  bool brighten = true;
+  char tickCharacter = 0;
+  bool mouseInside = false;
+  WString label;
+  Glib::FontDesc font;
+};
