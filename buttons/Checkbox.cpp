@@ -360,6 +360,7 @@ Kw::Box<int> Checkbox::labelBox() const {
 void Checkbox::draw() {
   drawBackground();
   drawBorder();
+  drawWidgets();
   drawTickBox();
   if (ticked) drawTick(true);
   drawLabel();
@@ -443,22 +444,30 @@ void Checkbox::drawTick(bool full) {
   }
 }
 
+Glib::FontDesc Checkbox::labelFont() const {
+  Glib::FontDesc desc = font;
+  if (boldWhenTicked && ticked) desc.style = Glib::FontDesc::Bold;
+  return desc;
+}
+
 void Checkbox::drawLabel() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   const Kw::Box<int> box = labelBox();
   if (!label.empty() && !box.empty()) {
-    Glib::FontDesc desc = font;
-    if (boldWhenTicked && ticked) desc.style = Glib::FontDesc::Bold;
-    p.text(label, box, *Glib::fonts().get(desc), getTextColour(), textAlignment,
+    p.text(label, box, *Glib::fonts().get(labelFont()), getTextColour(), textAlignment,
            Glib::TextStyles::Plain);
   }
   if (hasKeyboardFocus()) {
     const Kw::Box<int> ind = indicatorBox();
+    // Round the indicator and the label's text, not the whole label box.
+    Kw::Box<int> text = box;
+    if (!label.empty() && textAlignment == TextAlignment::Left)
+      text.x1 = std::min(box.x1, box.x0 + Glib::fonts().get(labelFont())->textWidth(label) + 2);
     const Kw::Box<int> mark = label.empty()
                                   ? inset(ind, -2, -2)
-                                  : Kw::Box<int>(std::min(ind.x0, box.x0) - 2, ind.y0 - 2,
-                                                 std::max(ind.x1, box.x1) + 1, ind.y1 + 2);
+                                  : Kw::Box<int>(std::min(ind.x0, text.x0) - 2, ind.y0 - 2,
+                                                 std::max(ind.x1, text.x1) + 1, ind.y1 + 2);
     p.focusRect(mark, getPalette().get(Palette::Focus));
   }
 }

@@ -177,6 +177,8 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public TabOrderab
   // The well or track, empty, in its hover and enablement look.
   void paintIndicatorWell();
   void drawLabel();
+  // The font the label shows in now (bold while ticked when asked).
+  Glib::FontDesc labelFont() const;
 
  private:
   void init(bool initialTicked);

@@ -61,7 +61,7 @@ void CheckboxRadioSet::layoutMembers() {
   if (n == 0) return;
   const Kw::Box<int> area = getUserArea();
   const int w = std::max(1, area.width()), h = std::max(1, area.height());
-  const bool row = width() > height();
+  const bool row = n * kMemberHeight + (n - 1) * kGap > h;
   for (int i = 0; i < n; ++i) {
     Checkbox* box = member(i);
     if (!box) continue;
@@ -78,6 +78,8 @@ void CheckboxRadioSet::layoutMembers() {
     box->reshape_canvas(box->canvas()->rect().x0, box->canvas()->rect().y0, size.x, size.y);
     setWidgetPos(box, pos, OriginInnerTopLeft);
   }
+  // A member keeping its offset is not placed again by setWidgetPos, yet its size changed.
+  recalculateWidgetPositions();
 }
 
 int CheckboxRadioSet::getSelectedItem() const {

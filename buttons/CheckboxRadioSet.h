@@ -14,8 +14,8 @@
 // - A member turned clear from the keyboard (Return and space always toggle a check box) is
 //   ticked again at once: the selection stays, and nothing is reported.
 // - Messages from check boxes on the panel that are not members go on unhandled.
-// - Layout: a row of equal widths when the panel is wider than it is tall, else a column from
-//   the top, each member at most kMemberHeight high, inside the panel's user area.
+// - Layout, inside the panel's user area: a column from the top, kMemberHeight per member, when
+//   all members fit stacked that way; otherwise a row of equal widths, vertically centred.
 // - A user selection asks the model with the check boxes' change type (kChangeUserToggle).
 // - setSelectedItem returns false, changing nothing, for an index out of range or negative,
 //   the selected index, or a deleted member.
