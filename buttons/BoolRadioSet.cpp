@@ -55,8 +55,8 @@ void BoolRadioSet::checkboxCallback(Checkbox* box, void* set) {
 }
 
 void BoolRadioSet::clicked(Checkbox* box) {
-  const bool value = true_.refersTo(box);
-  if (!value && !false_.refersTo(box)) return;
+  const bool value = true_.get() == box;
+  if (!value && false_.get() != box) return;
   if (box->getState()) return;  // the ticked box stays ticked
   GlobHandle<Checkbox> clickedBox(box);
   setState(value);

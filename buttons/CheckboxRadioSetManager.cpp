@@ -10,7 +10,7 @@ CheckboxRadioSetManager::~CheckboxRadioSetManager() {
 void CheckboxRadioSetManager::add(RadioSetCheckbox* box) {
   if (!box) return;
   for (const GlobHandle<RadioSetCheckbox>& m : members_)
-    if (m.refersTo(box) && m.alive()) return;
+    if (m.get() == box) return;
   box->setUserFunction(&CheckboxRadioSetManager::callback, this);
   members_.emplace_back(box);
 }

@@ -74,11 +74,11 @@ class RadioSetBase {
   T* buttonAt(int index) const {
     return index >= 0 && index < static_cast<int>(count) ? buttons[index].get() : nullptr;
   }
-  // The index of a live member, or -1.
+  // The index of a live member, or -1. `b` may dangle: it is compared, never read.
   int indexOf(const T* b) const {
     if (!b) return -1;
     for (int i = 0; i < static_cast<int>(count); ++i)
-      if (buttons[i].refersTo(b) && buttons[i].alive()) return i;
+      if (buttons[i].get() == b) return i;
     return -1;
   }
 
