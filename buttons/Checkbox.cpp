@@ -12,13 +12,6 @@ namespace {
 constexpr unsigned kKeyReturn = 13;
 constexpr unsigned kKeySpace = 32;
 
-GlobCreationInfo infoWithFlag(unsigned short width, unsigned short height, int flag,
-                              Canvas* parent) {
-  GlobCreationInfo info(width, height, parent);
-  info.flags = flag;
-  return info;
-}
-
 // Where a copy goes: the original's parent canvas, place, size and palette.
 GlobCreationInfo placementOf(const Checkbox& b) {
   const Kw::Box<int>& r = b.canvas()->rect();
@@ -45,7 +38,7 @@ Kw::Box<int> inset(const Kw::Box<int>& b, int dx, int dy) {
 // --- Construction ---
 
 Checkbox::Checkbox(unsigned short width, unsigned short height, bool tick, int flag, Canvas* parent)
-    : StandardPanel(infoWithFlag(width, height, flag, parent)) {
+    : StandardPanel(GlobCreationInfo::withFlags(width, height, flag, parent)) {
   init(tick);
 }
 

@@ -4,22 +4,11 @@
 
 const char* const CheckboxRadioSet::selectionChangedMsg = "CRSChanged";
 
-namespace {
-
-GlobCreationInfo infoWithFlag(unsigned short width, unsigned short height, int flag,
-                              Canvas* parent) {
-  GlobCreationInfo info(width, height, parent);
-  info.flags = flag;
-  return info;
-}
-
-}  // namespace
-
 CheckboxRadioSet::CheckboxRadioSet(const GlobCreationInfo& info) : StandardPanel(info) {}
 
 CheckboxRadioSet::CheckboxRadioSet(unsigned short width, unsigned short height, int flag,
                                    Canvas* parent)
-    : StandardPanel(infoWithFlag(width, height, flag, parent)) {}
+    : StandardPanel(GlobCreationInfo::withFlags(width, height, flag, parent)) {}
 
 CheckboxRadioSet::CheckboxRadioSet(const InitArgs& args)
     : StandardPanel(static_cast<const GlobCreationInfo&>(args)) {

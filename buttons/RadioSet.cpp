@@ -5,17 +5,6 @@
 #include "panels/PanelGeometry.h"
 #include "platform/glib/Painter.h"
 
-namespace {
-
-GlobCreationInfo infoWithFlag(unsigned short width, unsigned short height, int flag,
-                              Canvas* parent) {
-  GlobCreationInfo info(width, height, parent);
-  info.flags = flag;
-  return info;
-}
-
-}  // namespace
-
 RadioSet::RadioSet(const std::vector<WString>& labels, const GlobCreationInfo& info)
     : MenuGlob(info) {
   build(labels);
@@ -23,7 +12,7 @@ RadioSet::RadioSet(const std::vector<WString>& labels, const GlobCreationInfo& i
 
 RadioSet::RadioSet(const std::vector<WString>& labels, unsigned short width, unsigned short height,
                    int flag, Canvas* parent)
-    : MenuGlob(infoWithFlag(width, height, flag, parent)) {
+    : MenuGlob(GlobCreationInfo::withFlags(width, height, flag, parent)) {
   build(labels);
 }
 

@@ -321,11 +321,7 @@ bool StandardPanel::addWidget(Glob* widget, XY<int> pos, CoordinateOrigin origin
   d.pos = pos;
   d.origin = origin;
   d.surround = surround;
-  const WidgetDetails added = insertDetails(d, insertAfter);
-  recalculateWidgetPositions();
-  joinTabOrder(widget, insertAfter);
-  update();
-  handleWidgetAdded(added);
+  adopt(d, insertAfter);
   return true;
 }
 
@@ -350,12 +346,16 @@ bool StandardPanel::addWidgetRelative(Glob* widget, Glob* reference, unsigned ga
   d.relativity = relativity;
   d.alignment = alignment;
   // Appended, so that every widget comes after the widget it is placed against.
-  const WidgetDetails added = insertDetails(d, nullptr);
+  adopt(d, nullptr);
+  return true;
+}
+
+void StandardPanel::adopt(const WidgetDetails& details, Glob* insertAfter) {
+  const WidgetDetails added = insertDetails(details, insertAfter);
   recalculateWidgetPositions();
-  joinTabOrder(widget, nullptr);
+  joinTabOrder(details.widget.get(), insertAfter);
   update();
   handleWidgetAdded(added);
-  return true;
 }
 
 void StandardPanel::joinTabOrder(Glob* widget, Glob* insertAfter) {

@@ -202,6 +202,8 @@ class StandardPanel : public rect {
   bool isAncestorOrSelf(const Glob* g) const;
   bool canAdopt(Glob* widget) const;
   WidgetDetails& insertDetails(const WidgetDetails& d, Glob* insertAfter);
+  // Enters a new widget in the list and the tab order, places it and announces it.
+  void adopt(const WidgetDetails& details, Glob* insertAfter);
   void makeAbsolute(WidgetDetails& d);
   void joinTabOrder(Glob* widget, Glob* insertAfter);
   int reactToMessage(Event* e);

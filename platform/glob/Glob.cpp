@@ -38,9 +38,7 @@ Glob::Glob(const GlobCreationInfo& info) {
 }
 
 Glob::Glob(unsigned short width, unsigned short height, int flag, Canvas* parent) {
-  GlobCreationInfo info(width, height, parent);
-  info.flags = flag;
-  construct(info);
+  construct(GlobCreationInfo::withFlags(width, height, flag, parent));
 }
 
 Glob::Glob(CanvasHost* host, int width, int height) {

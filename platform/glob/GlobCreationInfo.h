@@ -16,4 +16,11 @@ struct GlobCreationInfo {
   GlobCreationInfo() = default;
   GlobCreationInfo(unsigned short w, unsigned short h, Canvas* parent, int px = 0, int py = 0)
       : width(w), height(h), canvas(parent), x(px), y(py) {}
+
+  // The record of the older explicit-geometry constructors: size, creation flags, parent.
+  static GlobCreationInfo withFlags(unsigned short w, unsigned short h, int flag, Canvas* parent) {
+    GlobCreationInfo info(w, h, parent);
+    info.flags = flag;
+    return info;
+  }
 };
