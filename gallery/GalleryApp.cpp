@@ -15,12 +15,12 @@ GalleryApp::GalleryApp(Glob& screen, MessageLog& log)
   selector_ = new PageSelector(GlobCreationInfo(kSidebarWidth, 100, canvas()), log_);
   pageArea_ = new Glob(GlobCreationInfo(100, 100, canvas()));
   pageArea_->set_name("Page area");
-  for (const GalleryPageSpec& spec : galleryPages()) {
-    auto* page = new GalleryPage(pageArea_->canvas(), spec.title, spec.summary, log_);
-    spec.build(*page);
+  for (const GalleryPageEntry& entry : galleryPages()) {
+    auto* page = new GalleryPage(pageArea_->canvas(), entry.title, entry.summary, log_);
+    entry.build(*page);
     page->unmap_canvas();
     pages_.push_back(page);
-    selector_->addEntry(spec.title, !page->isPlanned());
+    selector_->addEntry(entry.title, !page->isPlanned());
   }
   logView_ = new MessageLogView(GlobCreationInfo(100, kLogHeight, canvas()), log_);
   // The view may be gone by the time the log grows: the log outlives the window's Globs.

@@ -1,7 +1,7 @@
 #include "gallery/GalleryPages.h"
 
-const std::vector<GalleryPageSpec>& galleryPages() {
-  static const std::vector<GalleryPageSpec> pages = {
+const std::vector<GalleryPageEntry>& galleryPages() {
+  static const std::vector<GalleryPageEntry> pages = {
       {"Foundation",
        "Globs, message delivery and the keyboard: the ground every control stands on.",
        buildFoundationPage},

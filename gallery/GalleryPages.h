@@ -6,13 +6,13 @@
 
 #include "gallery/GalleryPage.h"
 
-struct GalleryPageSpec {
+struct GalleryPageEntry {
   const char* title;
   const char* summary;
   void (*build)(GalleryPage& page);
 };
 
-const std::vector<GalleryPageSpec>& galleryPages();
+const std::vector<GalleryPageEntry>& galleryPages();
 
 void buildFoundationPage(GalleryPage& page);
 void buildButtonsPage(GalleryPage& page);
