@@ -1,5 +1,7 @@
 #include "platform/misc/PreferenceCodec.h"
 
+#include "platform/misc/BackslashEscapes.h"
+
 #include <set>
 
 namespace {
@@ -26,13 +28,6 @@ void appendHex(String& out, unsigned char byte) {
   out += "\\x";
   out += digits[byte >> 4];
   out += digits[byte & 0xF];
-}
-
-int hexValue(char c) {
-  if (c >= '0' && c <= '9') return c - '0';
-  if (c >= 'a' && c <= 'f') return c - 'a' + 10;
-  if (c >= 'A' && c <= 'F') return c - 'A' + 10;
-  return -1;
 }
 
 }  // namespace
@@ -88,44 +83,7 @@ String PreferenceCodec::escape(std::string_view bytes, bool isKey) {
 }
 
 bool PreferenceCodec::unescape(std::string_view text, String& out) {
-  out.clear();
-  out.reserve(text.size());
-  for (std::size_t i = 0; i < text.size(); ++i) {
-    if (text[i] != '\\') {
-      out += text[i];
-      continue;
-    }
-    if (++i == text.size()) return false;
-    switch (text[i]) {
-      case '\\':
-        out += '\\';
-        break;
-      case 'n':
-        out += '\n';
-        break;
-      case 'r':
-        out += '\r';
-        break;
-      case 't':
-        out += '\t';
-        break;
-      case '=':
-        out += '=';
-        break;
-      case 'x': {
-        if (i + 2 >= text.size()) return false;
-        const int hi = hexValue(text[i + 1]);
-        const int lo = hexValue(text[i + 2]);
-        if (hi < 0 || lo < 0) return false;
-        out += static_cast<char>(hi * 16 + lo);
-        i += 2;
-        break;
-      }
-      default:
-        return false;
-    }
-  }
-  return true;
+  return BackslashEscapes::decode(text, out, BackslashEscapes::Set::WithBytes);
 }
 
 String PreferenceCodec::serialise(const Entries& entries) {

@@ -1,5 +1,7 @@
 #include "platform/misc/ResourceStrings.h"
 
+#include "platform/misc/BackslashEscapes.h"
+
 #include <charconv>
 
 #include "platform/misc/Diagnostics.h"
@@ -14,31 +16,7 @@ bool parseId(std::string_view s, unsigned int& id) {
 }
 
 bool unescape(std::string_view s, String& out) {
-  out.clear();
-  for (std::size_t i = 0; i < s.size(); ++i) {
-    if (s[i] != '\\') {
-      out += s[i];
-      continue;
-    }
-    if (++i == s.size()) return false;
-    switch (s[i]) {
-      case 't':
-        out += '\t';
-        break;
-      case 'n':
-        out += '\n';
-        break;
-      case 'r':
-        out += '\r';
-        break;
-      case '\\':
-        out += '\\';
-        break;
-      default:
-        return false;
-    }
-  }
-  return true;
+  return BackslashEscapes::decode(s, out, BackslashEscapes::Set::Basic);
 }
 
 }  // namespace
