@@ -110,7 +110,7 @@ TextBox* focusedBox(Harness& h, const WString& text) {
   args.text = text;
   auto* box = new TextBox(args);
   box->set_kbd_focus();
-  h.key(TextEditModel::kKeyEnd);
+  h.key(kKeyEnd);
   h.pump();
   return box;
 }

@@ -1,5 +1,7 @@
 #include "buttons/Button.h"
 
+#include "platform/glob/KeyCodes.h"
+
 #include <climits>
 #include <cmath>
 
@@ -15,9 +17,6 @@
 int Button::dragThreshold_ = 3;
 
 namespace {
-
-constexpr unsigned kKeyReturn = 13;
-constexpr unsigned kKeySpace = 32;
 
 bool validState(button_state s) {
   return s == kButtonUp || s == kButtonDown;

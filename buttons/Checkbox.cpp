@@ -1,5 +1,7 @@
 #include "buttons/Checkbox.h"
 
+#include "platform/glob/KeyCodes.h"
+
 #include <algorithm>
 
 #include "platform/glib/FontCache.h"
@@ -8,9 +10,6 @@
 #include "platform/glob/GlobHandle.h"
 
 namespace {
-
-constexpr unsigned kKeyReturn = 13;
-constexpr unsigned kKeySpace = 32;
 
 // Where a copy goes: the original's parent canvas, place, size and palette.
 GlobCreationInfo placementOf(const Checkbox& b) {

@@ -5,10 +5,7 @@
 #include "gallery/GalleryLook.h"
 #include "gallery/LevelMeter.h"
 #include "platform/glib/Painter.h"
-
-namespace {
-constexpr unsigned kTab = 9;
-}  // namespace
+#include "platform/glob/KeyCodes.h"
 
 BindingDemo::BindingDemo(const GlobCreationInfo& info) : Glob(info) {
   level_.setValue(4);
@@ -45,7 +42,7 @@ FocusRow::FocusRow(const GlobCreationInfo& info, int chips) : Glob(info) {
 }
 
 int FocusRow::react(Event* e) {
-  if (key_press_event(e) && (e->keyCode() & ~kKeyShift) == kTab) {
+  if (key_press_event(e) && (e->keyCode() & ~kKeyShift) == kKeyTab) {
     if (e->keyCode() & kKeyShift) {
       order_.decrementTabStop();
     } else {

@@ -1,5 +1,7 @@
 #include "gallery/KeyProbe.h"
 
+#include "platform/glob/KeyCodes.h"
+
 #include <cstdio>
 
 #include "gallery/GalleryLook.h"
@@ -16,25 +18,25 @@ String KeyProbe::keyName(unsigned code) {
   const unsigned low = code & 0x00FFFFFF;
   if (code & kKeyScanCode) {
     switch (low) {
-      case 0x47:
+      case kScanHome:
         return name + "Home";
-      case 0x48:
+      case kScanUp:
         return name + "Up";
-      case 0x49:
+      case kScanPageUp:
         return name + "PageUp";
-      case 0x4B:
+      case kScanLeft:
         return name + "Left";
-      case 0x4D:
+      case kScanRight:
         return name + "Right";
-      case 0x4F:
+      case kScanEnd:
         return name + "End";
-      case 0x50:
+      case kScanDown:
         return name + "Down";
-      case 0x51:
+      case kScanPageDown:
         return name + "PageDown";
-      case 0x52:
+      case kScanInsert:
         return name + "Insert";
-      case 0x53:
+      case kScanDelete:
         return name + "Delete";
       default: {
         char buf[24];

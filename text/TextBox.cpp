@@ -201,9 +201,9 @@ int TextBox::handleKeyboardEvent(int keyCode) {
 int TextBox::handleEditingKey(unsigned key) {
   const unsigned code = key & ~(kKeyShift | kKeyCtrl);
   switch (code) {
-    case TextEditModel::kKeyTab:
+    case kKeyTab:
       return 0;  // the tab order takes it
-    case TextEditModel::kKeyEnter: {
+    case kKeyReturn: {
       GlobHandle<> self(this);
       informOwner(EnterPressed, false, 0);
       if (self) handleTabStopFocusLoss();

@@ -31,6 +31,7 @@
 #include <string_view>
 #include <utility>
 
+#include "platform/glob/KeyCodes.h"
 #include "platform/kw/String.h"
 #include "text/EditHistory.h"
 
@@ -49,16 +50,8 @@ class TextEditModel {
     ToIndex = 6,
   };
 
-  // Key codes the model handles (the low bits of a key event, Shift and Ctrl masked off).
-  static constexpr unsigned kKeyBackspace = 8;
-  static constexpr unsigned kKeyTab = 9;
-  static constexpr unsigned kKeyEnter = 13;
-  static constexpr unsigned kKeyEscape = 27;
-  static constexpr unsigned kKeyHome = 0x08000047;
-  static constexpr unsigned kKeyLeft = 0x0800004B;
-  static constexpr unsigned kKeyRight = 0x0800004D;
-  static constexpr unsigned kKeyEnd = 0x0800004F;
-  static constexpr unsigned kKeyDelete = 0x08000053;
+  // The key codes the model handles are those of platform/glob/KeyCodes.h (Shift and Ctrl
+  // masked off).
 
   // The longest text the model holds; longer pastes are cut short.
   static constexpr std::size_t kMaxLength = 0x7FFFFFFF;

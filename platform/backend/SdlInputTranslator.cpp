@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <cmath>
 
-#include "platform/glob/Event.h"
+#include "platform/glob/KeyCodes.h"
 
 namespace {
 
@@ -11,25 +11,25 @@ namespace {
 unsigned scanCodeOf(SDL_Keycode sym) {
   switch (sym) {
     case SDLK_HOME:
-      return 0x47;
+      return kScanHome;
     case SDLK_UP:
-      return 0x48;
+      return kScanUp;
     case SDLK_PAGEUP:
-      return 0x49;
+      return kScanPageUp;
     case SDLK_LEFT:
-      return 0x4B;
+      return kScanLeft;
     case SDLK_RIGHT:
-      return 0x4D;
+      return kScanRight;
     case SDLK_END:
-      return 0x4F;
+      return kScanEnd;
     case SDLK_DOWN:
-      return 0x50;
+      return kScanDown;
     case SDLK_PAGEDOWN:
-      return 0x51;
+      return kScanPageDown;
     case SDLK_INSERT:
-      return 0x52;
+      return kScanInsert;
     case SDLK_DELETE:
-      return 0x53;
+      return kScanDelete;
     case SDLK_F1:
       return 0x3B;
     case SDLK_F2:
@@ -64,13 +64,13 @@ unsigned controlCharOf(SDL_Keycode sym) {
   switch (sym) {
     case SDLK_RETURN:
     case SDLK_KP_ENTER:
-      return 13;
+      return kKeyReturn;
     case SDLK_BACKSPACE:
-      return 8;
+      return kKeyBackspace;
     case SDLK_TAB:
-      return 9;
+      return kKeyTab;
     case SDLK_ESCAPE:
-      return 27;
+      return kKeyEscape;
     default:
       return 0;
   }

@@ -17,7 +17,7 @@ TEST(TextBoxLook, FocusSelectionAndOverwriteCaret) {
   Harness h(180, 44);
   TextBox* box = boxOn(h, L"Clip 12 take 3");
   box->set_kbd_focus();
-  h.key(TextEditModel::kKeyEnd);
+  h.key(kKeyEnd);
   EXPECT_TRUE(GoldenImage::check(h, *box, "textbox_focus"));
 
   box->setSelection(NumRange<int, true>(8, 12));

@@ -35,10 +35,10 @@ class TextBoxFixture : public ::testing::Test {
   static constexpr unsigned kEscape = 27;
   static constexpr unsigned kTab = 9;
   static constexpr unsigned kBackspace = 8;
-  static constexpr unsigned kHome = TextEditModel::kKeyHome;
-  static constexpr unsigned kLeft = TextEditModel::kKeyLeft;
-  static constexpr unsigned kRight = TextEditModel::kKeyRight;
-  static constexpr unsigned kEnd = TextEditModel::kKeyEnd;
+  static constexpr unsigned kHome = kKeyHome;
+  static constexpr unsigned kLeft = kKeyLeft;
+  static constexpr unsigned kRight = kKeyRight;
+  static constexpr unsigned kEnd = kKeyEnd;
 
   void SetUp() override { WindowsClipboard::setProvider(&clipboard); }
   void TearDown() override { WindowsClipboard::setProvider(nullptr); }

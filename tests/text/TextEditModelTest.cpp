@@ -9,13 +9,13 @@ namespace {
 using Model = TextEditModel;
 using Restriction = TextEditModel::CharacterRestriction;
 
-constexpr unsigned kHome = Model::kKeyHome;
-constexpr unsigned kLeft = Model::kKeyLeft;
-constexpr unsigned kRight = Model::kKeyRight;
-constexpr unsigned kEnd = Model::kKeyEnd;
-constexpr unsigned kDelete = Model::kKeyDelete;
-constexpr unsigned kBackspace = Model::kKeyBackspace;
-constexpr unsigned kEscape = Model::kKeyEscape;
+constexpr unsigned kHome = kKeyHome;
+constexpr unsigned kLeft = kKeyLeft;
+constexpr unsigned kRight = kKeyRight;
+constexpr unsigned kEnd = kKeyEnd;
+constexpr unsigned kDelete = kKeyDelete;
+constexpr unsigned kBackspace = kKeyBackspace;
+constexpr unsigned kEscape = kKeyEscape;
 
 void type(Model& m, const WString& s) {
   for (wchar_t ch : s) m.handleKey(static_cast<unsigned>(ch));
@@ -39,8 +39,8 @@ TEST(TextEditModel, CaretKeysStayInsideTheTextAndOtherKeysTravelOn) {
     EXPECT_EQ(m.caret(), caret);
   }
   const auto revision = m.revision();
-  for (unsigned key : {Model::kKeyTab, Model::kKeyEnter, kKeyShift | Model::kKeyTab,
-                       kKeyAlt | kLeft, kKeyCtrl | 0x41u, 0x08000048u}) {
+  for (unsigned key :
+       {kKeyTab, kKeyReturn, kKeyShift | kKeyTab, kKeyAlt | kLeft, kKeyCtrl | 0x41u, 0x08000048u}) {
     EXPECT_FALSE(m.handleKey(key)) << std::hex << key;
   }
   EXPECT_EQ(m.revision(), revision);
