@@ -8,7 +8,7 @@
 #include "platform/glob/RuntimeClock.h"
 #include "platform/misc/WindowsClipboard.h"
 #include "platform/os/OS.h"
-#include "text/CharClassifier.h"
+#include "platform/kw/CharClassifier.h"
 
 namespace {
 

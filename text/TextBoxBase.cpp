@@ -5,7 +5,7 @@
 #include "platform/glob/RuntimeClock.h"
 #include "platform/kw/String.h"
 #include "platform/misc/WindowsClipboard.h"
-#include "text/CharClassifier.h"
+#include "platform/kw/CharClassifier.h"
 
 const char* const TextBoxBase::copyMsg = "Copy";
 const char* const TextBoxBase::cutMsg = "Cut";

@@ -3,7 +3,7 @@
 #include <algorithm>
 
 #include "platform/glob/Event.h"
-#include "text/CharClassifier.h"
+#include "platform/kw/CharClassifier.h"
 
 namespace {
 using Item = EditHistory::Item;
@@ -63,21 +63,9 @@ int TextEditModel::seek(SeekMethod method, int from, int index) const {
     case SeekMethod::NextChar:
       return std::min(i + 1, len);
     case SeekMethod::NextWord:
-      // Over the rest of the word (or punctuation run) under the caret, then over spaces.
-      if (i < len && CharClassifier::classOf(text_[i]) != CharClass::Space) {
-        const wchar_t first = text_[i];
-        while (i < len && CharClassifier::sameCharType(first, text_[i])) ++i;
-      }
-      while (i < len && CharClassifier::classOf(text_[i]) == CharClass::Space) ++i;
-      return i;
+      return CharClassifier::nextWordStart(text_, i);
     case SeekMethod::PreviousWord:
-      // Back over spaces, then to the start of the run before them.
-      while (i > 0 && CharClassifier::classOf(text_[i - 1]) == CharClass::Space) --i;
-      if (i > 0) {
-        const wchar_t last = text_[i - 1];
-        while (i > 0 && CharClassifier::sameCharType(last, text_[i - 1])) --i;
-      }
-      return i;
+      return CharClassifier::previousWordStart(text_, i);
     case SeekMethod::StartOfText:
       return 0;
     case SeekMethod::EndOfText:

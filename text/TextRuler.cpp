@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "text/CharClassifier.h"
+#include "platform/kw/CharClassifier.h"
 
 namespace {
 

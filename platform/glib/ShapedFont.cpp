@@ -1,42 +1,11 @@
 #include "platform/glib/ShapedFont.h"
 
 #include <algorithm>
-#include <cwctype>
 
 #include "platform/glib/LayoutCache.h"
+#include "platform/kw/CharClassifier.h"
 
 namespace Glib {
-
-namespace {
-
-enum class CharClass { Space, Word, Other };
-
-CharClass classOf(wchar_t c) {
-  if (std::iswspace(static_cast<wint_t>(c))) return CharClass::Space;
-  if (std::iswalnum(static_cast<wint_t>(c)) || c == L'_') return CharClass::Word;
-  return CharClass::Other;
-}
-
-int nextWord(const WString& t, int i) {
-  const int n = static_cast<int>(t.size());
-  if (i >= n) return n;
-  const CharClass start = classOf(t[static_cast<size_t>(i)]);
-  if (start != CharClass::Space) {
-    while (i < n && classOf(t[static_cast<size_t>(i)]) == start) ++i;
-  }
-  while (i < n && classOf(t[static_cast<size_t>(i)]) == CharClass::Space) ++i;
-  return i;
-}
-
-int previousWord(const WString& t, int i) {
-  while (i > 0 && classOf(t[static_cast<size_t>(i - 1)]) == CharClass::Space) --i;
-  if (i == 0) return 0;
-  const CharClass word = classOf(t[static_cast<size_t>(i - 1)]);
-  while (i > 0 && classOf(t[static_cast<size_t>(i - 1)]) == word) --i;
-  return i;
-}
-
-}  // namespace
 
 ShapedFont::ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts,
                        GlyphCache& glyphs, int id)
@@ -93,10 +62,10 @@ iFont::CharacterLocation ShapedFont::charSeek(const WString& text, int fromIndex
       to = std::min(n, from + 1);
       break;
     case NextWord:
-      to = nextWord(text, from);
+      to = CharClassifier::nextWordStart(text, from);
       break;
     case PrevWord:
-      to = previousWord(text, from);
+      to = CharClassifier::previousWordStart(text, from);
       break;
     case Start:
       to = 0;

@@ -3,6 +3,7 @@
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/LayoutCache.h"
+#include "platform/kw/CharClassifier.h"
 
 namespace {
 
@@ -73,6 +74,17 @@ TEST(GlibFonts, CharSeekMethods) {
   EXPECT_EQ(font->charSeek(t, 0, Seek::ToIndex, 5).x, font->textWidth(L"alpha"));
   EXPECT_EQ(font->charSeek(t, 0, Seek::End).x, font->textWidth(t));
   EXPECT_EQ(font->charSeek(t, 4, Seek::Start).x, 0);
+
+  // Word moves follow the library's one word rule, which the text boxes use too: accented
+  // letters join their word and a run of symbols is a word of its own, whatever the locale.
+  const WString mixed = L"caf\u00E9-bar  \u00BFqu\u00E9? x_1 ->\u2192 end";
+  for (int i = 0; i <= static_cast<int>(mixed.size()); ++i) {
+    EXPECT_EQ(font->charSeek(mixed, i, Seek::NextWord).index,
+              CharClassifier::nextWordStart(mixed, i));
+    EXPECT_EQ(font->charSeek(mixed, i, Seek::PrevWord).index,
+              CharClassifier::previousWordStart(mixed, i));
+  }
+  EXPECT_EQ(font->charSeek(mixed, 0, Seek::NextWord).index, 4);  // "café", not "caf"
 }
 
 TEST(GlibFonts, LocateFindsNearestCaret) {

@@ -1,7 +1,7 @@
 #include <gtest/gtest.h>
 
 #include "platform/glob/Event.h"
-#include "text/CharClassifier.h"
+#include "platform/kw/CharClassifier.h"
 #include "text/TextEditModel.h"
 
 namespace {

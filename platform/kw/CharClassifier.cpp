@@ -1,4 +1,6 @@
-#include "text/CharClassifier.h"
+#include "platform/kw/CharClassifier.h"
+
+#include <algorithm>
 
 namespace {
 
@@ -56,4 +58,27 @@ CharClassifier::CharClass CharClassifier::classOf(wchar_t ch) {
   if (!isPrintable(ch)) return CharClass::Other;
   if (inSpans(c, kPunctuation)) return CharClass::Punctuation;
   return CharClass::Word;
+}
+
+int CharClassifier::nextWordStart(std::wstring_view text, int i) {
+  const int len = static_cast<int>(text.size());
+  i = std::clamp(i, 0, len);
+  auto at = [&](int k) { return text[static_cast<size_t>(k)]; };
+  if (i < len && classOf(at(i)) != CharClass::Space) {
+    const wchar_t first = at(i);
+    while (i < len && sameCharType(first, at(i))) ++i;
+  }
+  while (i < len && classOf(at(i)) == CharClass::Space) ++i;
+  return i;
+}
+
+int CharClassifier::previousWordStart(std::wstring_view text, int i) {
+  i = std::clamp(i, 0, static_cast<int>(text.size()));
+  auto at = [&](int k) { return text[static_cast<size_t>(k)]; };
+  while (i > 0 && classOf(at(i - 1)) == CharClass::Space) --i;
+  if (i > 0) {
+    const wchar_t last = at(i - 1);
+    while (i > 0 && sameCharType(last, at(i - 1))) --i;
+  }
+  return i;
 }

@@ -11,6 +11,8 @@
 //                punctuation, currency, arrow, mathematical and drawing blocks, CJK and
 //                full-width punctuation;
 //   Other        control characters, line breaks, surrogates and non-characters.
+#include <string_view>
+
 class CharClassifier {
  public:
   enum class CharClass { Word = 0, Space = 1, Punctuation = 2, Other = 3 };
@@ -27,4 +29,10 @@ class CharClassifier {
 
   // LF, VT, FF, CR, NEL, and the Unicode line and paragraph separators.
   static bool isLineBreak(wchar_t ch);
+
+  // Word moves, shared by the text boxes and the font service's caret seeks. Forward: over the
+  // rest of the run under `i` (unless it is spaces), then over spaces. Backward: over spaces,
+  // then to the start of the run before them. `i` is clamped to the text.
+  static int nextWordStart(std::wstring_view text, int i);
+  static int previousWordStart(std::wstring_view text, int i);
 };
