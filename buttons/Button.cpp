@@ -36,7 +36,7 @@ GlobCreationInfo placementOf(const Button& b) {
 // --- Construction ---
 
 Button::Button(const WString& l, const String& message, const GlobCreationInfo& info)
-    : rect(info), label(l) {
+    : rect(info), GlobTabStop(this), label(l) {
   set_message(message.c_str());
   init();
   post_init();
@@ -44,13 +44,13 @@ Button::Button(const WString& l, const String& message, const GlobCreationInfo& 
 
 Button::Button(const WString& l, const char* message, unsigned short width, unsigned short height,
                int flag, Canvas* parent)
-    : rect(width, height, flag, parent), label(l) {
+    : rect(width, height, flag, parent), GlobTabStop(this), label(l) {
   set_message(message);
   init();
   post_init();
 }
 
-Button::Button(const ButtonInitArgs& args) : rect(args), label(args.label) {
+Button::Button(const ButtonInitArgs& args) : rect(args), GlobTabStop(this), label(args.label) {
   set_message(args.message.c_str());
   init();
   applySettings(args);
@@ -59,7 +59,7 @@ Button::Button(const ButtonInitArgs& args) : rect(args), label(args.label) {
 }
 
 Button::Button(const Button& other)
-    : rect(placementOf(other)), ButtonWidget<WString>(), TabOrderable(), label(other.label) {
+    : rect(placementOf(other)), ButtonWidget<WString>(), GlobTabStop(this), label(other.label) {
   init();
   copySettingsFrom(other);
   post_init();
@@ -319,7 +319,7 @@ void Button::setActive(bool active, bool redraw) {
     if (latching == 0 && state == kButtonDown) set_state(kButtonUp, redraw);
     if (pressure == -1) pressure = 1;
     if (repeatInterval != 0) clear_interest(kInterestTicks);
-    if (glib_getCurrentMouseCanvas() == canvas()) handleMouseContainment(false);
+    if (glib_getCurrentMouseCanvas(this) == canvas()) handleMouseContainment(false);
   }
   rect::setActive(active, false);
   ignoreMouseClicks = active ? 0 : 1;
@@ -344,25 +344,6 @@ String Button::describeValue() const {
 void Button::setNewWidgetValue(WString& value) {
   setString(value);
   update();
-}
-
-// --- Tab order ---
-
-bool Button::isTabStopActive() {
-  return isActive() && canvas_is_mapped_to_root(canvas());
-}
-
-void Button::handleTabStopFocusReceipt() {
-  set_kbd_focus();
-}
-
-void Button::handleTabStopFocusLoss() {
-  if (get_kbd_focus() != this) return;
-  if (Glob* p = parent()) {
-    p->set_kbd_focus();
-  } else if (RootGlob* r = root()) {
-    r->setFocus(nullptr);
-  }
 }
 
 // --- Settings ---
@@ -553,10 +534,6 @@ Colour Button::faceColour() const {
 
 Colour Button::labelColour() const {
   return isActive() ? get_forecol() : getPalette().get(Palette::Disabled);
-}
-
-bool Button::hasKeyboardFocus() const {
-  return get_kbd_focus() == static_cast<const Glob*>(this);
 }
 
 void Button::draw() {

@@ -38,9 +38,9 @@
 #include <functional>
 
 #include "foundation/ButtonWidget.h"
+#include "foundation/GlobTabStop.h"
 #include "foundation/MessageReporter.h"
 #include "foundation/MessageSuffixes.h"
-#include "foundation/TabOrderable.h"
 #include "foundation/rect.h"
 #include "platform/glib/TextAlignment.h"
 #include "platform/glib/TextStyles.h"
@@ -79,7 +79,7 @@ class Image;
 class Painter;
 }  // namespace Glib
 
-class Button : public rect, public ButtonWidget<WString>, public TabOrderable {
+class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
  public:
   static constexpr double brightenFactor_ = 1.2;
   // The thinner bevel of the small buttons of a panel's title strip.
@@ -121,11 +121,6 @@ class Button : public rect, public ButtonWidget<WString>, public TabOrderable {
   WString getWidgetValue() override { return label; }
   void setNewWidgetValue(WString& value) override;
   void setEnabledState(bool enabled) override { setActive(enabled, true); }
-
-  // --- Tab order ---
-  bool isTabStopActive() override;
-  void handleTabStopFocusReceipt() override;
-  void handleTabStopFocusLoss() override;
 
   // --- Reporting ---
   // Sends `msg` (the button's message when empty) to the parent as a message event. The
@@ -200,7 +195,6 @@ class Button : public rect, public ButtonWidget<WString>, public TabOrderable {
   // The face and label colours as drawn: the state's, dimmed while inactive.
   Colour faceColour() const;
   Colour labelColour() const;
-  bool hasKeyboardFocus() const;
   // Where a symbol glyph standing for the label goes: the middle half of the button, nudged
   // like a label while pressed.
   Kw::Box<int> symbolBox() const;

@@ -37,22 +37,23 @@ Kw::Box<int> inset(const Kw::Box<int>& b, int dx, int dy) {
 // --- Construction ---
 
 Checkbox::Checkbox(unsigned short width, unsigned short height, bool tick, int flag, Canvas* parent)
-    : StandardPanel(GlobCreationInfo::withFlags(width, height, flag, parent)) {
+    : StandardPanel(GlobCreationInfo::withFlags(width, height, flag, parent)), GlobTabStop(this) {
   init(tick);
 }
 
-Checkbox::Checkbox(const GlobCreationInfo& info, bool tick) : StandardPanel(info) {
+Checkbox::Checkbox(const GlobCreationInfo& info, bool tick)
+    : StandardPanel(info), GlobTabStop(this) {
   init(tick);
 }
 
 Checkbox::Checkbox(const CheckboxInitArgs& args)
-    : StandardPanel(static_cast<const GlobCreationInfo&>(args)) {
+    : StandardPanel(static_cast<const GlobCreationInfo&>(args)), GlobTabStop(this) {
   init(args.ticked);
   applyArgs(args);
 }
 
 Checkbox::Checkbox(const Checkbox& other)
-    : StandardPanel(placementOf(other)), ValWidget<bool>(), TabOrderable() {
+    : StandardPanel(placementOf(other)), ValWidget<bool>(), GlobTabStop(this) {
   init(other.ticked);
   copySettingsFrom(other);
 }
@@ -180,12 +181,7 @@ String Checkbox::toggleMessage(bool withState) const {
 bool Checkbox::sendToggleMessage(bool withState) {
   Glob* to = parent();
   if (!to) return false;
-  Event e(kEventMessage);
-  e.message(toggleMessage(withState));
-  e.setSender(this);
-  e.dest = to;
-  e.canvas = canvas();
-  event_send(&e, false);
+  send_message_event(this, to, toggleMessage(withState));
   return true;
 }
 
@@ -239,23 +235,6 @@ void Checkbox::handleMouseContainment(bool inside) {
 void Checkbox::setBorderStyle(UifTypeOfBorder border) {
   borderStyle = border;
   StandardPanel::setBorderStyle(border);
-}
-
-bool Checkbox::isTabStopActive() {
-  return isActive() && canvas_is_mapped_to_root(canvas());
-}
-
-void Checkbox::handleTabStopFocusReceipt() {
-  set_kbd_focus();
-}
-
-void Checkbox::handleTabStopFocusLoss() {
-  if (!hasKeyboardFocus()) return;
-  if (Glob* p = parent()) p->set_kbd_focus();
-}
-
-bool Checkbox::hasKeyboardFocus() const {
-  return get_kbd_focus() == static_cast<const Glob*>(this);
 }
 
 String Checkbox::describeValue() const {

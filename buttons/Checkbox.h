@@ -31,7 +31,7 @@
 #include <cstdint>
 
 #include "foundation/DataChangeType.h"
-#include "foundation/TabOrderable.h"
+#include "foundation/GlobTabStop.h"
 #include "foundation/ValWidget.h"
 #include "panels/StandardPanel.h"
 #include "platform/glib/FontDesc.h"
@@ -58,7 +58,7 @@ struct CheckboxInitArgs : GlobCreationInfo {
       : GlobCreationInfo(where), label(l), ticked(tick) {}
 };
 
-class Checkbox : public StandardPanel, public ValWidget<bool>, public TabOrderable {
+class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabStop {
  public:
   enum eMsgGeneration : int { GenerateOnPress = 0, GenerateOnRelease = 1 };
   enum Appearance : int { BoxLeft = 0, BoxRight = 1, FlatToggle = 2 };
@@ -122,11 +122,6 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public TabOrderab
   void setNewWidgetValue(bool& value) override { setState(value); }
   void setEnabledState(bool enabled) override { setActive(enabled, true); }
 
-  // --- Tab order ---
-  bool isTabStopActive() override;
-  void handleTabStopFocusReceipt() override;
-  void handleTabStopFocusLoss() override;
-
   // --- Reporting ---
   void setMsgPrefix(const String& prefix, bool appendState = true);
   const String& getMsgPrefix() const { return msgPrefix; }
@@ -173,7 +168,6 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public TabOrderab
  protected:
   // The text colour over window shade 3 for the given enablement.
   Colour textColourFor(bool enabled) const;
-  bool hasKeyboardFocus() const;
   // The well or track, empty, in its hover and enablement look.
   void paintIndicatorWell();
   void drawLabel();

@@ -19,12 +19,6 @@ Glob* MessageReporter::target(Glob& self) {
 bool MessageReporter::report(Glob& self, const String& msg) const {
   Glob* to = target(self);
   if (!to) return false;
-  Event e(kEventMessage);
-  e.word2 = modifiers_;
-  e.message(msg.empty() ? message_ : msg);
-  e.setSender(&self);
-  e.dest = to;
-  e.canvas = self.canvas();
-  event_send(&e, false);
+  send_message_event(&self, to, msg.empty() ? message_ : msg, modifiers_);
   return true;
 }

@@ -18,7 +18,7 @@ int FocusChip::react(Event* e) {
 }
 
 void FocusChip::handleTabStopFocusLoss() {
-  if (get_kbd_focus() == this) {
+  if (hasKbdFocus()) {
     if (Glob* p = parent()) p->set_kbd_focus();
   }
 }
@@ -26,7 +26,7 @@ void FocusChip::handleTabStopFocusLoss() {
 void FocusChip::draw() {
   Glib::Painter p(*canvas());
   const GalleryLook look(getPalette());
-  const bool focused = get_kbd_focus() == this;
+  const bool focused = hasKbdFocus();
   look.card(p, p.bounds(), focused ? look.hover() : look.role(Palette::Button));
   look.label(p, label_, p.bounds(), GalleryLook::Font::Body,
              focused ? look.strongText() : look.text());

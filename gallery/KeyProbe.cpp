@@ -97,7 +97,7 @@ void KeyProbe::draw() {
   const GalleryLook look(getPalette());
   using F = GalleryLook::Font;
   const Kw::Box<int> b = p.bounds();
-  const bool focused = get_kbd_focus() == this;
+  const bool focused = hasKbdFocus();
   // A text field: a sunken well of the entry colour, marked while it has the keyboard.
   look.well(p, b, look.role(Palette::Base));
   if (focused) {

@@ -55,7 +55,7 @@ void TreeDump::node(const Glob& g, int rootHeight, double scale, int depth, Stri
   const String value = g.describeValue();
   if (!value.empty()) out += ", \"value\": " + quoted(value);
   out += String(", \"rect\": ") + rect + ", \"visible\": " + flag(g.canvas()->isMappedToRoot()) +
-         ", \"active\": " + flag(g.isActive()) + ", \"focus\": " + flag(get_kbd_focus() == &g) +
+         ", \"active\": " + flag(g.isActive()) + ", \"focus\": " + flag(g.hasKbdFocus()) +
          ", \"children\": [";
   const std::vector<Glob*> kids = g.children();
   if (kids.empty()) {

@@ -37,8 +37,7 @@ PanelTitleBoxFactory& titleBoxFactory() {
 }
 
 Canvas* screenCanvas() {
-  RootGlob* r = RootGlob::current();
-  return r ? r->canvas() : nullptr;
+  return nullptr;
 }
 
 GlobCreationInfo makeInfo(unsigned short width, unsigned short height, const Palette* palette,

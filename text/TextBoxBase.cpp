@@ -3,9 +3,9 @@
 #include "platform/glib/FontCache.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/glob/RuntimeClock.h"
+#include "platform/kw/CharClassifier.h"
 #include "platform/kw/String.h"
 #include "platform/misc/WindowsClipboard.h"
-#include "platform/kw/CharClassifier.h"
 
 const char* const TextBoxBase::copyMsg = "Copy";
 const char* const TextBoxBase::cutMsg = "Cut";
@@ -22,11 +22,11 @@ double now() {
 
 TextBoxBase::TextBoxBase(unsigned short width, unsigned short height, const Palette& palette,
                          Canvas* parent)
-    : StandardPanel(width, height, palette, false, parent) {
+    : StandardPanel(width, height, palette, false, parent), GlobTabStop(this) {
   init();
 }
 
-TextBoxBase::TextBoxBase(const GlobCreationInfo& info) : StandardPanel(info) {
+TextBoxBase::TextBoxBase(const GlobCreationInfo& info) : StandardPanel(info), GlobTabStop(this) {
   init();
 }
 
@@ -272,23 +272,6 @@ void TextBoxBase::addUndoItem(const HistoryItem& item) {
 
 // --- Tab order ---
 
-bool TextBoxBase::hasKeyboardFocus() const {
-  return get_kbd_focus() == this;
-}
-
 bool TextBoxBase::isTabStopActive() {
   return editable_ && canvas_is_mapped_to_root(canvas());
-}
-
-void TextBoxBase::handleTabStopFocusReceipt() {
-  set_kbd_focus();
-}
-
-void TextBoxBase::handleTabStopFocusLoss() {
-  if (!hasKeyboardFocus()) return;
-  if (Glob* up = parent()) {
-    up->set_kbd_focus();
-  } else if (RootGlob* r = root()) {
-    r->setFocus(nullptr);
-  }
 }

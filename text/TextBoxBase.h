@@ -23,6 +23,7 @@
 #include <cstdint>
 #include <vector>
 
+#include "foundation/GlobTabStop.h"
 #include "panels/StandardPanel.h"
 #include "platform/glib/FontDesc.h"
 #include "platform/glib/iFont.h"
@@ -31,7 +32,7 @@
 #include "text/TextCursor.h"
 #include "text/TextEditModel.h"
 
-class TextBoxBase : public StandardPanel, public TabOrderable {
+class TextBoxBase : public StandardPanel, public GlobTabStop {
  public:
   enum CallbackEvent : int32_t {
     FocusGained = 0,
@@ -143,12 +144,10 @@ class TextBoxBase : public StandardPanel, public TabOrderable {
   bool reviewMenu(Event* e) override;
   const char* idstring() const override { return "textboxbase"; }
 
-  // --- TabOrderable ---
+  // --- Tab order: a stop while editable and shown, whether active or not ---
   bool isTabStopActive() override;
-  void handleTabStopFocusReceipt() override;
-  void handleTabStopFocusLoss() override;
 
-  bool hasKeyboardFocus() const;
+  using GlobTabStop::hasKeyboardFocus;
   double lastKeyTime() const { return lastKeyTime_; }
 
  protected:

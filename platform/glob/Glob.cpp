@@ -149,11 +149,7 @@ int Glob::call_msg(Glob* target, const char* msg) {
     diagError("call_msg nested too deeply, message dropped: " + String(msg ? msg : "") + "\n");
     return -1;
   }
-  Event e(kEventMessage);
-  e.message(msg ? msg : "");
-  e.setSender(this);
-  e.dest = target;
-  e.canvas = target->canvas();
+  Event e = make_message_event(this, target, msg ? msg : "");
   ++gCallDepth;
   const int result = target->react(&e);
   --gCallDepth;
@@ -236,23 +232,22 @@ RootGlob* Glob::root() const {
   return dynamic_cast<RootGlob*>(canvas_->host());
 }
 
+bool Glob::hasKbdFocus() const {
+  const RootGlob* r = root();
+  return r && r->focus() == this;
+}
+
 void Glob::send_msg(Glob* target, const char* msg) {
   if (!is_good_glob_ptr(target)) {
     diagWarning("send_msg to a deleted Glob dropped: " + String(msg ? msg : "") + "\n");
     return;
   }
   RootGlob* r = target->root();
-  if (!r) r = RootGlob::current();
   if (!r) {
-    diagWarning("send_msg with no screen to deliver it dropped: " + String(msg ? msg : "") + "\n");
+    diagWarning("send_msg to a Glob on no screen dropped: " + String(msg ? msg : "") + "\n");
     return;
   }
-  Event e(kEventMessage);
-  e.message(msg ? msg : "");
-  e.setSender(this);
-  e.dest = target;
-  e.canvas = target->canvas();
-  r->post(e);
+  r->post(make_message_event(this, target, msg ? msg : ""));
 }
 
 int Glob::clock() {
@@ -270,8 +265,10 @@ int event_send(Event* e, bool queued) {
   if (!e->canvas) e->canvas = dest->canvas();
   RootGlob* r = dest->root();
   if (queued) {
-    if (!r) r = RootGlob::current();
-    if (!r) return 0;
+    if (!r) {
+      diagWarning("queued event for a Glob on no screen dropped\n");
+      return 0;
+    }
     r->post(*e);
     return 0;
   }
@@ -289,8 +286,24 @@ int event_send(Event* e, bool queued) {
   return dest->react(e);
 }
 
-Glob* get_kbd_focus() {
-  RootGlob* r = RootGlob::current();
+Event make_message_event(Glob* from, Glob* to, const String& text, uint32_t modifiers) {
+  Event e(kEventMessage);
+  e.word2 = modifiers;
+  e.message(text);
+  e.setSender(from);
+  e.dest = to;
+  e.canvas = is_good_glob_ptr(to) ? to->canvas() : nullptr;
+  return e;
+}
+
+int send_message_event(Glob* from, Glob* to, const String& text, uint32_t modifiers) {
+  if (!is_good_glob_ptr(to)) return 0;
+  Event e = make_message_event(from, to, text, modifiers);
+  return event_send(&e, false);
+}
+
+Glob* get_kbd_focus(const Glob* g) {
+  RootGlob* r = is_good_glob_ptr(g) ? g->root() : nullptr;
   return r ? r->focus() : nullptr;
 }
 
@@ -298,8 +311,8 @@ bool canvas_is_mapped_to_root(const Canvas* c) {
   return c && c->isMappedToRoot();
 }
 
-Canvas* glib_getCurrentMouseCanvas() {
-  RootGlob* r = RootGlob::current();
+Canvas* glib_getCurrentMouseCanvas(const Glob* on) {
+  RootGlob* r = is_good_glob_ptr(on) ? on->root() : nullptr;
   Glob* g = r ? r->hovered() : nullptr;
   return g ? g->canvas() : nullptr;
 }
@@ -315,7 +328,7 @@ XY<double> centreOf(const Glob* g) {
 
 Glob* find_nearest_glob(Glob* g, Glob* exclude) {
   if (!is_good_glob_ptr(g)) return nullptr;
-  RootGlob* r = RootGlob::current();
+  RootGlob* r = g->root();
   if (!r) return nullptr;
   const XY<double> c = centreOf(g);
   Glob* found = r->globAt(XY<int>(static_cast<int>(c.x), static_cast<int>(c.y)));

@@ -49,7 +49,7 @@ class Glob : public CanvasClient, public Drawable {
   // Delivers `msg` to `target` now and returns its react result; -1 when the target is gone
   // or the nesting of synchronous messages is too deep.
   virtual int call_msg(Glob* target, const char* msg);
-  // Called when this Glob gains or loses the keyboard focus; get_kbd_focus() tells which.
+  // Called when this Glob gains or loses the keyboard focus; hasKbdFocus() tells which.
   virtual void handle_kbd_focus() {}
   virtual String get_id() const;
   virtual String get_name() const { return name_; }
@@ -89,7 +89,10 @@ class Glob : public CanvasClient, public Drawable {
   int interest() const { return interest_; }
   void ensure_canvas_is_mapped() { map_canvas(); }
   std::vector<Glob*> children() const;
+  // The screen this Glob is on, or null while it is unattached.
   RootGlob* root() const;
+  // Whether this Glob holds the keyboard focus of its own screen.
+  bool hasKbdFocus() const;
   // The help text shown by tooltips; the base contextString returns it.
   void setContextString(const String& text) { contextText_ = text; }
   // The cursor the base contextCursor returns.
@@ -142,13 +145,21 @@ bool glob_serial_is_alive(const Glob* g, uint64_t serial);
 // copied and delivered by the loop in order; the call then returns 0.
 int event_send(Event* e, bool queued);
 
+// --- Messages ---
+// A message event from `from` to `to` carrying `text` and the modifier word.
+Event make_message_event(Glob* from, Glob* to, const String& text, uint32_t modifiers = 0);
+// Sends that event synchronously; returns the receiver's react result (0 when `to` is gone).
+// The receiver may delete `from`.
+int send_message_event(Glob* from, Glob* to, const String& text, uint32_t modifiers = 0);
+
 // --- Focus ---
-Glob* get_kbd_focus();
+// The keyboard focus of the screen that `g` is on; null when g is unattached or gone.
+Glob* get_kbd_focus(const Glob* g);
 
 // --- Geometry queries ---
 bool canvas_is_mapped_to_root(const Canvas* c);
-// The canvas under the pointer, or null.
-Canvas* glib_getCurrentMouseCanvas();
+// The canvas under the pointer on the screen that `g` is on, or null.
+Canvas* glib_getCurrentMouseCanvas(const Glob* g);
 // The Glob nearest to `g` other than `g` itself and `exclude`: the deepest Glob of the screen
 // whose canvas contains g's centre. Null when there is none.
 Glob* find_nearest_glob(Glob* g, Glob* exclude);

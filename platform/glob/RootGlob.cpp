@@ -5,31 +5,17 @@
 #include "platform/glob/RuntimeClock.h"
 #include "platform/misc/Diagnostics.h"
 
-namespace {
-std::vector<RootGlob*>& liveRoots() {
-  static std::vector<RootGlob*> roots;
-  return roots;
-}
-}  // namespace
-
 RootGlob::RootGlob(int width, int height) : Glob(this, width, height) {
-  liveRoots().push_back(this);
   nextTick_ = RuntimeClock::now() + tickPeriodMs_;
   canvasDamaged(canvas()->rootRect());
 }
 
 RootGlob::~RootGlob() {
-  auto& roots = liveRoots();
-  roots.erase(std::remove(roots.begin(), roots.end(), this), roots.end());
   // The children go while the screen's own state still exists: their canvases report damage
   // and removal to it on the way out.
   deleteChildren();
   queue_.clear();
   tickers_.clear();
-}
-
-RootGlob* RootGlob::current() {
-  return liveRoots().empty() ? nullptr : liveRoots().back();
 }
 
 // --- Input ---

@@ -19,9 +19,6 @@ class RootGlob : public Glob, public CanvasHost {
   RootGlob(int width, int height);
   ~RootGlob() override;
 
-  // The screen that free functions such as get_kbd_focus() refer to: the newest live root.
-  static RootGlob* current();
-
   // --- Input, in root coordinates (bottom-left origin, y upward) ---
   // `type` is a mouse event code. Moves become drags while a button is held.
   void injectMouse(int type, XY<int> pos, int wheelSteps = 0);
@@ -103,5 +100,4 @@ class RootGlob : public Glob, public CanvasHost {
   DirtyRegion dirty_;
   PaintSession* painting_ = nullptr;
   std::function<void(Glob*)> drawObserver_;
-  RootGlob* previousRoot_ = nullptr;
 };

@@ -380,7 +380,7 @@ TEST_F(ButtonTest, TabStopsFollowActivityAndHandFocusBack) {
   m.addTabStop(b, TabOrderManager::kAfterLast);
 
   m.incrementTabStop();
-  EXPECT_EQ(get_kbd_focus(), a);
+  EXPECT_EQ(h.root().focus(), a);
   h.key(13);
   EXPECT_EQ(parent.texts(), Texts{"a"});
 
@@ -393,11 +393,11 @@ TEST_F(ButtonTest, TabStopsFollowActivityAndHandFocusBack) {
   EXPECT_FALSE(b->isTabStopActive());
   b->setVisible(true);
   m.incrementTabStop();
-  EXPECT_EQ(get_kbd_focus(), b);
+  EXPECT_EQ(h.root().focus(), b);
 
   // Losing the tab focus gives the keyboard focus to the parent.
   b->relinquishTabStopFocus();
-  EXPECT_EQ(get_kbd_focus(), &parent);
+  EXPECT_EQ(h.root().focus(), &parent);
 }
 
 TEST_F(ButtonTest, ButtonDeletedByItsOwnReportIsNotTouched) {

@@ -232,13 +232,13 @@ TEST_F(BoxFixture, TabMovesFocusBetweenBoxesAndLosingItReturnsFocusToTheParent) 
   host.addWidget(first, 5, 5);
   host.addWidget(second, 5, 40);
   ASSERT_TRUE(host.incrementTab());
-  EXPECT_EQ(get_kbd_focus(), first);
+  EXPECT_EQ(h.root().focus(), first);
   h.key(9);
-  EXPECT_EQ(get_kbd_focus(), second);
+  EXPECT_EQ(h.root().focus(), second);
   h.key(32);
   EXPECT_TRUE(second->getState());
   second->handleTabStopFocusLoss();
-  EXPECT_EQ(get_kbd_focus(), &host);
+  EXPECT_EQ(h.root().focus(), &host);
 
   second->setActive(false, false);
   EXPECT_FALSE(second->isTabStopActive());

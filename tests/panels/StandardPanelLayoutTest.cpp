@@ -199,7 +199,7 @@ TEST(PanelConstruction, FromAConfigurationRecord) {
   EXPECT_EQ(a.canvas()->rect(), Box(12, 0, 332, 90));
   EXPECT_EQ(a.getBorderStyle(), UifBorderFramed);
   EXPECT_EQ(a.getTitleW(), L"Mixer");
-  EXPECT_EQ(a.parent(), &h.root());
+  EXPECT_EQ(a.parent(), nullptr);  // no canvas given: unattached
 
   // Bad values fall back to the defaults given, with a report.
   Diagnostics::Capture capture;

@@ -76,7 +76,7 @@ TEST(GlobRouting, ContainmentFollowsThePointer) {
   s.h.move(XY<int>(151, 80));
   EXPECT_EQ(s.button->containment, (std::vector<bool>{true, false}));
   EXPECT_EQ(s.panel->containment, (std::vector<bool>{true}));
-  EXPECT_EQ(glib_getCurrentMouseCanvas(), s.panel->canvas());
+  EXPECT_EQ(glib_getCurrentMouseCanvas(s.panel), s.panel->canvas());
   s.panel->setDefaultCursor(kCursorHand);
   s.panel->setContextString("Panel help");
   EXPECT_EQ(s.h.root().cursorAtPointer(), kCursorHand);
@@ -90,7 +90,7 @@ TEST(GlobRouting, KeysGoToFocusAndFocusChangesAreAnnounced) {
   Scene s;
   auto* other = new RecordingGlob(s.h.place(250, 10, 40, 40));
   s.button->set_kbd_focus();
-  EXPECT_EQ(get_kbd_focus(), s.button);
+  EXPECT_EQ(s.h.root().focus(), s.button);
   s.h.key('a');
   EXPECT_EQ(s.button->count(kEventKeyPress), 1);
   EXPECT_EQ(s.button->seen.back().word2, 'a');
@@ -109,7 +109,7 @@ TEST(GlobRouting, KeysGoToFocusAndFocusChangesAreAnnounced) {
 
   // Unmapping the focus clears it, and the loser hears of it.
   s.button->unmap_canvas();
-  EXPECT_EQ(get_kbd_focus(), nullptr);
+  EXPECT_EQ(s.h.root().focus(), nullptr);
   EXPECT_FALSE(s.button->focusCalls.back());
 }
 
@@ -123,14 +123,14 @@ TEST(GlobRouting, LoserMayMoveFocusElsewhere) {
     Glob* to = nullptr;
     void handle_kbd_focus() override {
       RecordingGlob::handle_kbd_focus();
-      if (get_kbd_focus() != this && to) to->set_kbd_focus();
+      if (!hasKbdFocus() && to) to->set_kbd_focus();
     }
   };
   auto* r = new Redirect(s.h.place(300, 100, 20, 20));
   r->to = third;
   r->set_kbd_focus();
   s.panel->set_kbd_focus();
-  EXPECT_EQ(get_kbd_focus(), third);
+  EXPECT_EQ(s.h.root().focus(), third);
   EXPECT_TRUE(s.panel->focusCalls.empty());
 }
 
@@ -295,13 +295,14 @@ TEST(GlobTicks, TickHandlerMayDeleteItselfOrOthers) {
 
 TEST(GlobGeometry, NearestGlobAndPseudoDistance) {
   Scene s;
-  // An unattached Glob is placed at root coordinates of its own; its centre (45, 45) lies
-  // inside the button.
-  RecordingGlob loose(GlobCreationInfo(10, 10, nullptr, 40, 40));
+  // A Glob on a surface that is no Glob, under the others; its centre (45, 45) lies inside the
+  // button.
+  PlainSurface surface(s.h.canvas(), Kw::Box<int>(0, 0, 400, 300));
+  RecordingGlob loose(GlobCreationInfo(10, 10, surface.canvas(), 40, 40));
   EXPECT_EQ(find_nearest_glob(&loose, nullptr), s.button);
   EXPECT_LT(glob_pseudo_distance(&loose, s.button), 0.0);
   EXPECT_EQ(find_nearest_glob(&loose, s.button), s.panel);
-  RecordingGlob far(GlobCreationInfo(10, 10, nullptr, 350, 250));
+  RecordingGlob far(GlobCreationInfo(10, 10, surface.canvas(), 350, 250));
   EXPECT_EQ(find_nearest_glob(&far, nullptr), &s.h.root());
   EXPECT_GT(glob_pseudo_distance(&far, s.panel), 0.0);
 }

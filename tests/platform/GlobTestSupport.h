@@ -24,7 +24,7 @@ class RecordingGlob : public Glob {
     }
     return consume ? 1 : Glob::react(e);
   }
-  void handle_kbd_focus() override { focusCalls.push_back(get_kbd_focus() == this); }
+  void handle_kbd_focus() override { focusCalls.push_back(hasKbdFocus()); }
   void handleMouseContainment(bool inside) override { containment.push_back(inside); }
   void draw() override { ++draws; }
 
@@ -41,4 +41,21 @@ class RecordingGlob : public Glob {
   std::function<int(Event*)> onEvent;
   bool consume = true;
   int draws = 0;
+};
+
+// A surface on a screen that is not a Glob: a Glob placed on it is on the screen but has no
+// parent Glob. Made before the Globs it should lie under, or lowered, so that they stay on top.
+class PlainSurface : public CanvasClient {
+ public:
+  PlainSurface(Canvas* screen, const Kw::Box<int>& rect) : canvas_(screen, this, rect) {
+    canvas_.lower();
+  }
+  Canvas* canvas() { return &canvas_; }
+  const char* idstring() const override { return "surface"; }
+  String contextString(const XY<int>&, CanvasClient*) override { return String(); }
+  MouseCursorID contextCursor(const XY<int>&) override { return kCursorArrow; }
+  void handleMouseContainment(bool) override {}
+
+ private:
+  Canvas canvas_;
 };

@@ -79,7 +79,7 @@ TEST_F(TextBoxFixture, AnOwnerMayDeleteTheBoxFromAnyCallback) {
     h.key(kEnter);
     h.pump();
     EXPECT_FALSE(alive) << event;
-    EXPECT_EQ(get_kbd_focus(), event == TextBoxBase::TextChangedByKey ? nullptr : owner);
+    EXPECT_EQ(h.root().focus(), event == TextBoxBase::TextChangedByKey ? nullptr : owner);
   }
 }
 
@@ -200,7 +200,7 @@ TEST_F(TextBoxFixture, EnterRaisesThreeThenOneAndHandsTheFocusToTheParent) {
   owner->clear();
   h.key(kEnter);
   EXPECT_EQ(events(), (Strings{"event 3", "event 1"}));
-  EXPECT_EQ(get_kbd_focus(), owner);
+  EXPECT_EQ(h.root().focus(), owner);
   EXPECT_EQ(box->caret(), nullptr);
 
   // Unchanged text: Enter raises 3 only.
@@ -233,7 +233,7 @@ TEST_F(TextBoxFixture, KeysOnAReadOnlyOrInactiveBoxTravelToTheOwner) {
   h.type(L"a");
   box->setActive(true, true);
   box->setEditable(false);  // drops the focus to the parent at once
-  EXPECT_EQ(get_kbd_focus(), owner);
+  EXPECT_EQ(h.root().focus(), owner);
   EXPECT_EQ(box->getText(), L"text");
   EXPECT_EQ(owner->keysReceived, std::vector<unsigned>{'a'});
   EXPECT_FALSE(box->isTabStopActive());

@@ -54,7 +54,7 @@ TEST_F(TextBoxFixture, ReadOnlyBoxesShareOneSecondClickClock) {
   h.clickOn(*first);
   EXPECT_EQ(events(), Strings{"event 4"});
   // The click is not consumed: the owner sees it; the read-only box never takes the focus.
-  EXPECT_NE(get_kbd_focus(), first);
+  EXPECT_NE(h.root().focus(), first);
   owner->clear();
   h.advance(100);
   h.clickOn(*second);  // 100 ms after a click on the other box
@@ -71,7 +71,7 @@ TEST_F(TextBoxFixture, ClickPlacesTheCaretAndDragSelects) {
   const int y = static_cast<int>(box->get_y()) + 12;
   // The first click gives the focus, which selects everything.
   h.click(XY<int>(rootXOf(*box, 3), y));
-  EXPECT_EQ(get_kbd_focus(), box);
+  EXPECT_EQ(h.root().focus(), box);
   EXPECT_EQ(box->getSelectedText(), L"alpha beta gamma");
   // A click in the focused box puts the caret at the nearest character boundary.
   h.click(XY<int>(rootXOf(*box, 3) + 1, y));
@@ -170,12 +170,12 @@ TEST_F(TextBoxFixture, TabMovesBetweenBoxesOfAPanel) {
   a->set_kbd_focus();
   EXPECT_TRUE(a->isTabStopFocus());
   h.key(kTab);
-  EXPECT_EQ(get_kbd_focus(), b);
+  EXPECT_EQ(h.root().focus(), b);
   EXPECT_TRUE(b->isTabStopFocus());
   EXPECT_EQ(a->caret(), nullptr);
   ASSERT_NE(b->caret(), nullptr);
   h.key(kTab | kKeyShift);
-  EXPECT_EQ(get_kbd_focus(), a);
+  EXPECT_EQ(h.root().focus(), a);
   // A click on a box also makes it the panel's current stop.
   h.clickOn(*b);
   EXPECT_TRUE(b->isTabStopFocus());
