@@ -191,7 +191,8 @@ void Button::switch_state(button_state newState, bool silent) {
     }
     if (!self) return;
   }
-  set_state(newState, true);
+  // The receiver may have made the button inactive: it does not go down then.
+  set_state(isActive() ? newState : kButtonUp, true);
 }
 
 void Button::applyStatePalette() {
@@ -261,6 +262,10 @@ int Button::reactWhileTracking(Event* e) {
 }
 
 int Button::reactToTick() {
+  if (!isActive()) {
+    clear_interest(kInterestTicks);
+    return 1;
+  }
   if (repeatInterval > 0 && state == kButtonDown) {
     const int now = clock();
     const int wait = firstRepeat ? repeatDelay : repeatInterval;
@@ -280,6 +285,8 @@ int Button::reactToPress(Event*) {
   if (!self) return 1;
   widgetLeftClicked();
   if (!self) return 1;
+  // Made inactive by a receiver: no press to track and nothing to repeat.
+  if (!isActive()) return 1;
   if (pressure != 0) pressure = -1;
   if (repeatInterval != 0) set_interest(kInterestTicks);
   return 1;

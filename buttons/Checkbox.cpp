@@ -168,9 +168,22 @@ void Checkbox::requestToggleState() {
     return;
   }
   GlobHandle<Checkbox> self(this);
-  setState(!ticked);
+  const bool wanted = !ticked;
+  setState(wanted);
   // The model's answer may have deleted the box.
-  if (self) sendToggleMessage(appendState);
+  if (!self) return;
+  // A model that refused the toggle keeps its value: the box shows that and reports nothing.
+  if (getDataAdaptor()) {
+    const bool held = getDataValue();
+    if (held != wanted) {
+      if (held != ticked) {
+        setStateInternal(held);
+        update();
+      }
+      return;
+    }
+  }
+  sendToggleMessage(appendState);
 }
 
 String Checkbox::toggleMessage(bool withState) const {
@@ -198,6 +211,7 @@ void Checkbox::setUserFunction(UserFunction fn, void* data) {
 // --- Events ---
 
 int Checkbox::react(Event* e) {
+  if (!e) return 0;
   if (clicksEnabled && mouse_left_event(e) && isActive()) return reactToLeftButton(e);
   if (e->type == kEventKeyPress && (e->keyCode() == kKeyReturn || e->keyCode() == kKeySpace)) {
     // Deliberately not gated on isActive(): a focused inactive box still toggles from the keys.

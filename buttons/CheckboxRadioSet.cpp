@@ -88,10 +88,16 @@ bool CheckboxRadioSet::setSelectedItem(int index) {
 
 void CheckboxRadioSet::select(int index) {
   refresh_off();
+  GlobHandle<CheckboxRadioSet> self(this);
   const int previous = getSelectedItem();
   if (Checkbox* old = member(previous); old && previous != index && old->getState()) {
     old->setState(false);
-    old->setClicksEnabled(true);
+    // The member's model may have deleted the set or the member.
+    if (!self) {
+      refresh_on();
+      return;
+    }
+    if ((old = member(previous))) old->setClicksEnabled(true);
   }
   if (Checkbox* box = member(index)) {
     box->setState(true);
@@ -116,16 +122,22 @@ int CheckboxRadioSet::handleMessageEvent(const String& msg, Glob* sender) {
     box->setState(true);
     return 1;
   }
+  GlobHandle<CheckboxRadioSet> self(this);
   refresh_off();
   for (int i = 0; i < memberCount(); ++i) {
     Checkbox* other = member(i);
     if (other && other != box && other->getState()) {
       other->setState(false);
-      other->setClicksEnabled(true);
+      // Its model may have deleted the set or any member: read them again.
+      if (!self) {
+        refresh_on();
+        return 1;
+      }
+      if ((other = member(i))) other->setClicksEnabled(true);
       break;
     }
   }
-  box->setClicksEnabled(false);
+  if ((box = member(index))) box->setClicksEnabled(false);
   refresh_on();
   reportSelection();
   return 1;

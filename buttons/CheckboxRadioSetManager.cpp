@@ -30,8 +30,10 @@ void CheckboxRadioSetManager::callback(Checkbox* box, void* manager) {
 void CheckboxRadioSetManager::callback(Checkbox* box) {
   refresh_off();
   GlobHandle<Checkbox> clicked(box);
+  // A member's model may delete the row, and this manager with it: walk a copy of the list.
+  const std::vector<GlobHandle<RadioSetCheckbox>> members = members_;
   box->setState(true);
-  for (const GlobHandle<RadioSetCheckbox>& m : members_) {
+  for (const GlobHandle<RadioSetCheckbox>& m : members) {
     RadioSetCheckbox* other = m.get();
     if (other && static_cast<Checkbox*>(other) != box) other->setState(false);
   }

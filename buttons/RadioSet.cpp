@@ -4,6 +4,7 @@
 
 #include "panels/PanelGeometry.h"
 #include "platform/glib/Painter.h"
+#include "platform/glob/GlobHandle.h"
 
 RadioSet::RadioSet(const std::vector<WString>& labels, const GlobCreationInfo& info)
     : MenuGlob(info) {
@@ -29,6 +30,14 @@ void RadioSet::build(const std::vector<WString>& labels) {
   }
   set_current(0, true);
   reshape();
+}
+
+void RadioSet::set_current(int index, bool flag) {
+  GlobHandle<RadioSet> self(this);
+  const bool outer = !switching_;
+  switching_ = true;
+  RadioSetBase<Button>::set_current(index, flag);
+  if (self && outer) switching_ = false;
 }
 
 bool RadioSet::setSelectedItem(int index) {
@@ -119,7 +128,7 @@ int RadioSet::reactToMember(Event* e, int index) {
   }
   // An " off": the previous button going up is swallowed; the selected one pressed again is
   // put back down.
-  if (index == getCurrentButton()) {
+  if (!switching_ && index == getCurrentButton()) {
     if (Button* b = buttonAt(index)) b->switch_state(kButtonDown, true);
   }
   return 1;

@@ -11,6 +11,8 @@
 //   equal heights from the top, inside the border with a 2-pixel gap between buttons.
 // - Border styles are those of the panels: raised (5 px), framed (10 px), sunken (6 px), none.
 // - Pressing the selected button does not deselect it: it goes straight back down, silently.
+// - While set_current switches the members, the previous member's " off" is its going up, not
+//   a press of the selected member, whichever member `current` names at that moment.
 // - setSelectedItem is a program change: it reports nothing. It returns false, changing
 //   nothing, for an index out of range (negative included) or of a deleted button.
 #include <vector>
@@ -32,6 +34,8 @@ class RadioSet : public MenuGlob, public RadioSetBase<Button> {
 
   static const char* radioSetMessage() { return "radio_set_message"; }
 
+  void set_current(int index, bool flag) override;
+
   int getSelectedItem() const { return getCurrentButton(); }
   bool setSelectedItem(int index);
   void setBorderStyle(UifTypeOfBorder border);
@@ -49,4 +53,5 @@ class RadioSet : public MenuGlob, public RadioSetBase<Button> {
   int reactToMember(Event* e, int index);
 
   UifTypeOfBorder border_ = UifBorderNone;
+  bool switching_ = false;  // inside set_current
 };

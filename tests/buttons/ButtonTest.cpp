@@ -251,6 +251,45 @@ TEST_F(ButtonTest, InactiveButtonsDoNotStayDownUnlessLatching) {
   EXPECT_EQ(parent.texts(), Texts{"b off"});
 }
 
+TEST_F(ButtonTest, AButtonItsOwnReportDeactivatesNeitherStaysDownNorRepeatsNorTracks) {
+  Button* plain = make("plain", 20, 20);
+  Button* repeating = make("rep", 100, 20);
+  repeating->set_repeating(10, 0.0);
+  Button* pressure = make("pres", 180, 20);
+  pressure->set_pressure_button(1);
+  for (Button* b : {plain, repeating}) {
+    parent.trigger = b->get_message();
+    parent.action = [b] { b->setActive(false, true); };
+    h.press(centre(*b));
+    EXPECT_EQ(b->get_state(), kButtonUp) << b->get_message();
+    EXPECT_EQ(b->interest() & kInterestTicks, 0) << b->get_message();
+    h.advance(500);
+    h.release(centre(*b));
+  }
+  EXPECT_EQ(parent.count("rep"), 1);
+
+  parent.trigger = "pres pressed";
+  parent.action = [pressure] { pressure->setActive(false, true); };
+  h.press(centre(*pressure));
+  EXPECT_EQ(pressure->get_state(), kButtonUp);
+  EXPECT_EQ(pressure->get_pressure(), 1);  // not tracking
+  h.release(centre(*pressure));
+  EXPECT_EQ(parent.count("pres released"), 0);
+
+  // A repeating button made inactive from a later repeat stops repeating at once.
+  repeating->setActive(true, true);
+  parent.trigger = "rep";
+  int reports = 0;
+  parent.action = [&reports, repeating] {
+    if (++reports == 3) repeating->setActive(false, true);
+  };
+  h.press(centre(*repeating));
+  h.advance(1000);
+  EXPECT_EQ(reports, 3);
+  EXPECT_EQ(repeating->get_state(), kButtonUp);
+  h.release(centre(*repeating));
+}
+
 TEST_F(ButtonTest, IgnoredClicksChangeNothing) {
   Button* b = make("x");
   b->set_ignore_mouse_clicks(1);

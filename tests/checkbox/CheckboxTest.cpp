@@ -7,6 +7,7 @@
 #include "foundation/ValServerAdaptor.h"
 #include "platform/glib/FontCache.h"
 #include "platform/glob/GlobHandle.h"
+#include "platform/glob/KeyCodes.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
 
@@ -181,6 +182,29 @@ TEST_F(BoxFixture, BoundBoxesFollowOneModelValueAndAskWithTheToggleChangeType) {
   c->setState(true, false);  // quiet: stored only
   EXPECT_TRUE(c->getState());
   EXPECT_EQ(recorder->reasons.size(), 1u);
+}
+
+TEST_F(BoxFixture, AToggleTheModelRefusesShowsTheModelsValueAndReportsNothing) {
+  // A model that holds on to false whatever it is asked.
+  class Stubborn : public ValAdaptorBase<bool> {
+   public:
+    bool getDataValue() override { return false; }
+    bool requestSetNewDataValue(const bool&, DataChangeType) override { return false; }
+  };
+  Checkbox* box = makeBox(10, 10);
+  box->setDataAdaptor(Kw::Ptr<ValAdaptorBase<bool>>(new Stubborn));
+  h.clickOn(*box);
+  box->set_kbd_focus();
+  h.key(kKeySpace);
+  EXPECT_FALSE(box->getState());
+  EXPECT_TRUE(panel.messages().empty());
+
+  // Null events and events after the model has gone change nothing and crash nothing.
+  EXPECT_EQ(box->react(nullptr), 0);
+  box->setDataAdaptor(Kw::Ptr<ValAdaptorBase<bool>>());
+  h.clickOn(*box);
+  EXPECT_TRUE(box->getState());
+  EXPECT_EQ(panel.texts(), std::vector<String>{"Checkbox TICKED"});
 }
 
 TEST_F(BoxFixture, TextColourFollowsTickAndEnablement) {

@@ -7,6 +7,7 @@
 #include "buttons/RadioSet.h"
 #include "buttons/RadioSetBase.h"
 #include "foundation/ValServerAdaptor.h"
+#include "platform/glob/KeyCodes.h"
 #include "platform/misc/Diagnostics.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
@@ -146,9 +147,25 @@ TEST_F(RadioFixture, MouseSelectionCallsTheParentExactlyOnce) {
   EXPECT_EQ(set->buttonAt(2)->get_state(), kButtonDown);
 
   set->buttonAt(1)->set_kbd_focus();
-  h.key(32);
+  h.key(kKeySpace);
   EXPECT_EQ(spy.texts.size(), 2u);
   EXPECT_EQ(set->getSelectedItem(), 1);
+}
+
+TEST_F(RadioFixture, TheReportingFormOfSetCurrentLeavesOneMemberDownAndCallsOnce) {
+  SelectionSpy<RadioSet> spy(h.place(0, 0, 400, 100));
+  auto* set = new RadioSet(threeLabels(), at(spy, 10, 10, 300, 24));
+  spy.set = set;
+  set->set_current(2, false);
+  EXPECT_EQ(set->buttonAt(0)->get_state(), kButtonUp);
+  EXPECT_EQ(set->buttonAt(2)->get_state(), kButtonDown);
+  EXPECT_EQ(spy.texts, std::vector<String>{"radio_set_message"});
+  EXPECT_EQ(spy.selections, std::vector<int>{2});
+
+  // A press of the selected member afterwards still only puts it back down.
+  h.clickOn(*set->buttonAt(2));
+  EXPECT_EQ(set->buttonAt(2)->get_state(), kButtonDown);
+  EXPECT_EQ(spy.texts.size(), 1u);
 }
 
 TEST_F(RadioFixture, ProgramSelectionIsQuietAndRefusesBadIndices) {
