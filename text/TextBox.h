@@ -15,15 +15,14 @@
 //
 // The mouse, on an active box (chords and presses with Ctrl or Alt are the owner's):
 //
-//   input                      editable, no focus          editable, focus            read-only
-//   left press                 takes the focus (selects    caret to the pointer,      second click
-//                              all), Shift: then extends   anchored; Shift: extends   within 400 ms
-//                              from the start              from the anchor            raises event
-//                              4
-//   2nd press, same place      -                           selects the word           (not
-//   consumed) 3rd press, same place      -                           selects everything left drag
-//   extends from the start      extends from the anchor    - right press openEditMenu openEditMenu
-//   openEditMenu
+//   input               editable, no focus      editable, with focus       read-only
+//   left press          takes the focus, which  caret to the pointer,      a second press within
+//                       selects all; Shift:     anchored; Shift: extends   400 ms raises event 4;
+//                       extends from the start  from the anchor            the press goes on
+//   2nd press, there    -                       selects the word           as above
+//   3rd press, there    -                       selects everything         as above
+//   left drag           extends from the start  extends from the anchor    -
+//   right press         openEditMenu            openEditMenu               openEditMenu
 //
 // Choices made here:
 // - eCursorPos names the two ends of the text: CursorAtStart and CursorAtEnd.

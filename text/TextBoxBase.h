@@ -20,8 +20,8 @@
 //   changes the text. The message is consumed either way.
 // - One gate for characters, one path for the caret: the editing model puts every character
 //   that typing, a paste or composed text would insert to `isAllowed`, and every caret move it
-//   makes (keys, clicks, edits, undo, selections, setText) to `updateCurrentPosition`, once
-//   per change. A subclass that overrides either sees everything.
+//   makes (keys, clicks, edits, undo, selections, setText) to `updateCurrentPosition` (the
+//   model's hooks say when). A subclass that overrides either sees everything.
 // - Ctrl+A (kKeySelectAll) is a shortcut beside those of the clipboard and undo: it selects
 //   everything (`highlightAllText(true)`).
 // - The context menu offers "Cut", "Copy" and "Paste" by message: reviewMenu agrees to show a
