@@ -2,13 +2,14 @@
 
 #include <algorithm>
 #include <climits>
+#include <cstdlib>
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
 #include "platform/glob/RuntimeClock.h"
+#include "platform/kw/CharClassifier.h"
 #include "platform/misc/WindowsClipboard.h"
 #include "platform/os/OS.h"
-#include "platform/kw/CharClassifier.h"
 
 namespace {
 
@@ -49,14 +50,14 @@ void TextBox::apply(const InitArgs& args) {
   rightMargin_ = args.rightMargin;
   alignment_ = args.alignment;
   obfuscated_ = args.obfuscated;
+  model_.setMask(obfuscated_ ? kObfuscationChar : 0);
   if (!(args.font == getFontDesc())) TextBoxBase::setFont(args.font);
   setEditable(args.editable);
   setSizeLimit(args.sizeLimit);
   setCharacters(args.characters, args.restriction);
   setGhostLabel(args.ghostLabel);
   ruler_.setFont(displayFont());
-  model_.setText(args.text);
-  model_.setCaret(0);
+  model_.setText(args.text, TextEditModel::SeekMethod::StartOfText);
   relayout();
 }
 
@@ -67,8 +68,8 @@ double TextBox::lastReadOnlyClickTime() {
 // --- Contents ---
 
 void TextBox::setText(const WString& text) {
-  model_.setText(text);
-  if (!focused_) model_.setCaret(0);
+  model_.setText(text, focused_ ? TextEditModel::SeekMethod::EndOfText
+                                : TextEditModel::SeekMethod::StartOfText);
   scrollOffset_ = 0;
   changed();
 }
@@ -155,7 +156,7 @@ WString TextBox::getText(CharPos from, CharPos to) const {
 
 void TextBox::updateCurrentPosition(Glib::iFont::eCharSeekMethod method, int index) {
   if (method < Glib::iFont::PrevChar || method > Glib::iFont::ToIndex) return;
-  model_.moveCaret(static_cast<TextEditModel::SeekMethod>(method), index);
+  model_.applyCaretMove(static_cast<TextEditModel::SeekMethod>(method), index);
   changed();
 }
 
@@ -221,37 +222,77 @@ int TextBox::handleMouseEvent(Event* e) {
   const OSKeyboard& keys = OS()->keyboard();
   if (keys.isKeyDown(OSKeyboard::kCtrl) || keys.isKeyDown(OSKeyboard::kAlt)) return 0;
 
-  if (!isEditable()) {
-    if (mouse_down_event(e)) {
-      const double t = now();
-      // A clock that went back (a new manual clock) never makes a second click.
-      const double since = t - gLastReadOnlyClick;
-      const bool second = since >= 0.0 && since < kSecondClickMs;
-      gLastReadOnlyClick = t;
-      if (second) informOwner(SecondClick, false, 0);
-    }
-    return 0;  // the click itself goes on to the owner
+  if (!isEditable() && mouse_down_event(e)) {
+    const double t = now();
+    // A clock that went back (a new manual clock) never makes a second click.
+    const double since = t - gLastReadOnlyClick;
+    const bool second = since >= 0.0 && since < kSecondClickMs;
+    gLastReadOnlyClick = t;
+    if (second) informOwner(SecondClick, false, 0);
   }
+  if (mouse_right_event(e)) {
+    if (!mouse_down_event(e)) return 0;
+    GlobHandle<> self(this);
+    const bool shown = openEditMenu(e->pos);
+    return shown || !self ? 1 : 0;
+  }
+  if (!isEditable()) return 0;  // the click itself goes on to the owner
   if (!mouse_left_event(e)) return 0;
 
-  const int index = ruler_.indexAt(std::max<int64_t>(displayXToTextX(e->pos.x), 0));
-  if (mouse_down_event(e)) {
-    model_.setCaret(index);
-    if (focused_) {
-      model_.anchorSelection();
-    } else {
-      model_.clearSelection();
-      GlobHandle<> self(this);
-      set_kbd_focus();
-      if (!self) return 1;
-    }
-  } else if (mouse_move_event(e)) {
-    model_.dragTo(index);
+  if (mouse_down_event(e)) return handleLeftPress(*e, keys.isKeyDown(OSKeyboard::kShift));
+  if (mouse_move_event(e)) {
+    model_.dragTo(caretIndexAt(e->pos.x));
   } else if (mouse_up_event(e)) {
     if (!model_.hasSelection()) model_.clearSelection();
   }
   changed();
   return 1;
+}
+
+int TextBox::handleLeftPress(const Event& e, bool shift) {
+  const int clicks = countClick(e.screenPos);
+  if (!focused_) {
+    // Taking the focus selects everything; a Shift press then extends from the start.
+    model_.clearSelection();
+    GlobHandle<> self(this);
+    set_kbd_focus();
+    if (!self) return 1;
+    if (shift && focused_) model_.extendSelectionTo(caretIndexAt(e.pos.x));
+  } else if (shift) {
+    model_.extendSelectionTo(caretIndexAt(e.pos.x));
+  } else if (clicks == 2) {
+    model_.selectWordAt(characterIndexAt(e.pos.x));
+  } else if (clicks == 3) {
+    model_.highlightAll(true);
+  } else {
+    model_.setCaret(caretIndexAt(e.pos.x));
+    model_.anchorSelection();
+  }
+  changed();
+  return 1;
+}
+
+int TextBox::countClick(XY<int> rootPos) {
+  const double t = now();
+  const double since = t - lastClickTime_;
+  const bool samePlace = std::abs(rootPos.x - lastClickPos_.x) <= kClickSlop &&
+                         std::abs(rootPos.y - lastClickPos_.y) <= kClickSlop;
+  const bool again =
+      clicks_ > 0 && clicks_ < 3 && since >= 0.0 && since < kSecondClickMs && samePlace;
+  clicks_ = again ? clicks_ + 1 : 1;
+  lastClickTime_ = t;
+  lastClickPos_ = rootPos;
+  return clicks_;
+}
+
+int TextBox::caretIndexAt(int x) const {
+  return ruler_.indexAt(std::max<int64_t>(displayXToTextX(x), 0));
+}
+
+int TextBox::characterIndexAt(int x) const {
+  const int64_t textX = std::max<int64_t>(displayXToTextX(x), 0);
+  const int index = ruler_.indexAt(textX);
+  return index > 0 && textX < ruler_.xOf(index) ? index - 1 : index;
 }
 
 // --- Focus ---
@@ -324,6 +365,7 @@ void TextBox::setMargins(unsigned char left, unsigned char right) {
 void TextBox::setObfuscatedDisplay(bool on) {
   if (on == obfuscated_) return;
   obfuscated_ = on;
+  model_.setMask(on ? kObfuscationChar : 0);
   fontChanged();
   update();
 }
@@ -414,10 +456,7 @@ void TextBox::placeCaret() {
   const Glib::FontPtr font = displayFont();
   if (c->font() != font) c->setFont(font->desc());
   c->placeAt(XY<int>(caretDisplayX(), caretY()));
-  if (getEditMode() == EditOverwrite) {
-    c->setCurrentChar(obfuscated_ && model_.caret() < model_.length() ? kObfuscationChar
-                                                                      : model_.characterAtCaret());
-  }
+  if (getEditMode() == EditOverwrite) c->setCurrentChar(model_.characterAtCaret());
   holdCaretSteady();
 }
 

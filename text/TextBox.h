@@ -3,28 +3,45 @@
 // mouse, the clipboard, word-wise undo and redo, a hidden-text (password) display and a ghost
 // label, telling its owner of editing through the callback events of TextBoxBase.
 //
+// Where each decision lives (each is stated once, in the header named):
+//   TextEditModel  text, caret, selection, filter, size limit, overwrite, undo grouping, the
+//                  editing and caret keys, word moves and word selection, masked text
+//   EditHistory    the undo and redo lists and their depth
+//   TextBoxBase    callbacks, shortcuts (Ctrl+A among them), composed text, the character gate
+//                  and caret path (isAllowed, updateCurrentPosition), the edit menu hook
+//   TextBox        layout and scrolling, mouse, focus, obfuscated display, drawing
+//   TextCursor     flashing and the block caret
+//   TextRuler      measuring and the pieces that are drawn
+//
+// The mouse, on an active box (chords and presses with Ctrl or Alt are the owner's):
+//
+//   input               editable, no focus      editable, with focus       read-only
+//   left press          takes the focus, which  caret to the pointer,      a second press within
+//                       selects all; Shift:     anchored; Shift: extends   400 ms raises event 4;
+//                       extends from the start  from the anchor            the press goes on
+//   2nd press, there    -                       selects the word           as above
+//   3rd press, there    -                       selects everything         as above
+//   left drag           extends from the start  extends from the anchor    -
+//   right press         openEditMenu            openEditMenu               openEditMenu
+//
 // Choices made here:
 // - eCursorPos names the two ends of the text: CursorAtStart and CursorAtEnd.
 // - InitArgs carries the creation record and every setting below; its defaults are those of
 //   the (width, height, palette, canvas) constructor: editable, left-aligned, margins of
 //   kDefaultMargin, the standard font, no limit, no filter, no ghost label, plain display.
-// - The size limit follows the editing model: a typed character is refused when the text,
-//   less what the character replaces (the selection, or in overwrite mode the character after
-//   the caret), already has the limit's length. A paste that starts short of the limit goes in
-//   whole.
-// - Undo history: a new edit clears the redo list; the undo list keeps the newest
-//   EditHistory::kDepth edits (one per typed character). setText clears both lists, so undo
-//   after setText does nothing.
+// - A double click is a left press less than kSecondClickMs after the previous one and within
+//   kClickSlop pixels of it; a third such press selects everything, and a fourth starts
+//   again as a single click. The word is the one under the pointer (see TextEditModel).
 // - Text that is wider than the visible stretch starts at the left margin whatever the
 //   alignment, and scrolls; alignment applies only to text that fits. The scroll offset moves
 //   only as far as needed to keep the caret in the stretch, and never further than shows the
 //   end of the text at the right margin.
 // - Shortcuts and Escape keep the selection they leave; the caret keys collapse or extend it.
 // - Copy with nothing to copy leaves the clipboard alone. In obfuscated display the box puts
-//   nothing on the clipboard: copy does nothing, and cut only erases.
-// - Only the left button edits; presses with Ctrl or Alt held, and chords, are left to the
-//   owner. A press on a box without the keyboard focus gives it the focus, which selects
-//   everything; a drag from there selects from the start to the pointer.
+//   nothing on the clipboard: copy does nothing, and cut only erases. The model is masked
+//   with the asterisk, so the overwrite caret, word moves and double clicks hide the text too.
+// - A press on a box without the keyboard focus gives it the focus, which selects everything;
+//   a drag from there selects from the start to the pointer.
 // - The box registers nothing with a global service while it holds the focus.
 // - Drawing: a sunken well in the base colour, the text clipped to the stretch between the
 //   margins, the selection in the highlight colour, the ghost label in the ghost colour and
@@ -46,6 +63,8 @@ class TextBox : public TextBoxBase {
   enum eCursorPos : int { CursorAtStart = 0, CursorAtEnd = 1 };
 
   static constexpr double kSecondClickMs = 400.0;
+  // How far apart, in pixels each way, two presses of a double click may be.
+  static constexpr int kClickSlop = 3;
   static constexpr unsigned char kDefaultMargin = 4;
   static constexpr wchar_t kObfuscationChar = L'*';
   static constexpr const char* kObfuscationFace = "courier";
@@ -150,6 +169,13 @@ class TextBox : public TextBoxBase {
   // Lays the text out again and repaints after a change of the model.
   void changed();
   int handleEditingKey(unsigned key);
+  int handleLeftPress(const Event& e, bool shift);
+  // Counts a left press as the first, second or third of a multiple click.
+  int countClick(XY<int> rootPos);
+  // The character under display x (the boundary nearest to it for caret placement is
+  // caretIndexAt).
+  int characterIndexAt(int x) const;
+  int caretIndexAt(int x) const;
   void gainFocus();
   void loseFocus();
   int stretchWidth() const;
@@ -164,4 +190,7 @@ class TextBox : public TextBoxBase {
   TextAlignment alignment_ = TextAlignment::Left;
   bool obfuscated_ = false;
   bool focused_ = false;
+  int clicks_ = 0;
+  double lastClickTime_ = 0.0;
+  XY<int> lastClickPos_;
 };

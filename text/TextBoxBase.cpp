@@ -18,6 +18,16 @@ double now() {
   return static_cast<double>(RuntimeClock::now());
 }
 
+// The model's caret moves are the font's seek methods, number for number.
+using Seek = TextEditModel::SeekMethod;
+static_assert(static_cast<int>(Seek::PreviousChar) == Glib::iFont::PrevChar);
+static_assert(static_cast<int>(Seek::NextChar) == Glib::iFont::NextChar);
+static_assert(static_cast<int>(Seek::NextWord) == Glib::iFont::NextWord);
+static_assert(static_cast<int>(Seek::PreviousWord) == Glib::iFont::PrevWord);
+static_assert(static_cast<int>(Seek::StartOfText) == Glib::iFont::Start);
+static_assert(static_cast<int>(Seek::EndOfText) == Glib::iFont::End);
+static_assert(static_cast<int>(Seek::ToIndex) == Glib::iFont::ToIndex);
+
 }  // namespace
 
 TextBoxBase::TextBoxBase(unsigned short width, unsigned short height, const Palette& palette,
@@ -34,6 +44,13 @@ TextBoxBase::~TextBoxBase() = default;
 
 void TextBoxBase::init() {
   font_ = Glib::FontPtr(Glib::fonts().get(fontDesc_));
+  // The model asks only once the box is built, from user input or the owner's calls.
+  TextEditModel::Hooks hooks;
+  hooks.allows = [this](wchar_t ch) { return isAllowed(ch); };
+  hooks.moveCaret = [this](TextEditModel::SeekMethod method, int index) {
+    updateCurrentPosition(static_cast<Glib::iFont::eCharSeekMethod>(method), index);
+  };
+  model_.setHooks(std::move(hooks));
 }
 
 // --- Settings ---
@@ -196,6 +213,7 @@ int TextBoxBase::handleKeyboardEvent(int keyCode) {
     case kKeyUndo:
     case kKeyAltBackspace:
     case kKeyRedo:
+    case kKeySelectAll:
       break;
     default:
       return 0;
@@ -214,6 +232,9 @@ int TextBoxBase::handleKeyboardEvent(int keyCode) {
     case kKeyUndo:
     case kKeyAltBackspace:
       undo();
+      break;
+    case kKeySelectAll:
+      highlightAllText(true);
       break;
     default:
       redo();

@@ -18,8 +18,16 @@
 // - Text composed by an input method ("CompoundTextInput", UTF-8 in the event's payload) is
 //   pasted only into an editable, active box; it raises event 2 with key code 0 when it
 //   changes the text. The message is consumed either way.
+// - One gate for characters, one path for the caret: the editing model puts every character
+//   that typing, a paste or composed text would insert to `isAllowed`, and every caret move it
+//   makes (keys, clicks, edits, undo, selections, setText) to `updateCurrentPosition` (the
+//   model's hooks say when). A subclass that overrides either sees everything.
+// - Ctrl+A (kKeySelectAll) is a shortcut beside those of the clipboard and undo: it selects
+//   everything (`highlightAllText(true)`).
 // - The context menu offers "Cut", "Copy" and "Paste" by message: reviewMenu agrees to show a
-//   menu for an active box.
+//   menu for an active box. A right-button press on an active box, editable or not, calls
+//   `openEditMenu` with the press position in the box; the base shows nothing and returns
+//   false, so the press travels on to the owner until the menu code fills the hook.
 #include <cstdint>
 #include <vector>
 
@@ -67,6 +75,7 @@ class TextBoxBase : public StandardPanel, public GlobTabStop {
   static constexpr unsigned kKeyUndo = 0x0200005A;
   static constexpr unsigned kKeyAltBackspace = 0x04000008;
   static constexpr unsigned kKeyRedo = 0x02000059;
+  static constexpr unsigned kKeySelectAll = kKeyCtrl | 'A';
 
   // How long after the last key the caret starts flashing again.
   static constexpr double kFlashPauseMs = 500.0;
@@ -135,6 +144,9 @@ class TextBoxBase : public StandardPanel, public GlobTabStop {
   virtual void updateCurrentPosition(Glib::iFont::eCharSeekMethod method, int index) = 0;
   // The font of the text (a new virtual of the text boxes).
   virtual void setFont(const Glib::FontDesc& font);
+  // Offers Cut, Copy and Paste at `pos` (the box's coordinates) after a right-button press;
+  // true when a menu showed, which consumes the press. The base has no menu yet.
+  virtual bool openEditMenu(XY<int> pos) { return false; }
 
   // --- Glob ---
   int react(Event* e) override;

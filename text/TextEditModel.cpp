@@ -21,16 +21,16 @@ WString TextEditModel::textRange(int from, int to) const {
   return text_.substr(lo, hi - lo);
 }
 
-bool TextEditModel::setText(const WString& text) {
+bool TextEditModel::setText(const WString& text, SeekMethod caretTo) {
   if (text_ == text && hasSaved_ && saved_ == text && !modified_) return false;
   text_ = text.size() > kMaxLength ? text.substr(0, kMaxLength) : text;
   ++revision_;
   saved_ = text_;
   hasSaved_ = true;
   modified_ = false;
-  caret_ = length();
   clearSelection();
   history_.clear();
+  moveCaret(caretTo);
   return true;
 }
 
@@ -63,9 +63,9 @@ int TextEditModel::seek(SeekMethod method, int from, int index) const {
     case SeekMethod::NextChar:
       return std::min(i + 1, len);
     case SeekMethod::NextWord:
-      return CharClassifier::nextWordStart(text_, i);
+      return isMasked() ? len : CharClassifier::nextWordStart(text_, i);
     case SeekMethod::PreviousWord:
-      return CharClassifier::previousWordStart(text_, i);
+      return isMasked() ? 0 : CharClassifier::previousWordStart(text_, i);
     case SeekMethod::StartOfText:
       return 0;
     case SeekMethod::EndOfText:
@@ -77,19 +77,57 @@ int TextEditModel::seek(SeekMethod method, int from, int index) const {
 }
 
 void TextEditModel::moveCaret(SeekMethod method, int index) {
+  if (seek(method, caret_, index) != caret_) {
+    if (hooks_.moveCaret) {
+      hooks_.moveCaret(method, index);
+    } else {
+      applyCaretMove(method, index);
+    }
+  }
+  caret_ = clampIndex(caret_);
+}
+
+void TextEditModel::applyCaretMove(SeekMethod method, int index) {
   caret_ = seek(method, caret_, index);
 }
 
 bool TextEditModel::select(int anchor, int caret) {
   if (anchor < 0 || caret < 0) return false;
+  setCaret(caret);
   selStart_ = clampIndex(anchor);
-  selEnd_ = caret_ = clampIndex(caret);
+  selEnd_ = caret_;
   return true;
+}
+
+void TextEditModel::extendSelectionTo(int index) {
+  if (selStart_ < 0) anchorSelection();
+  setCaret(index);
+  selEnd_ = caret_;
+}
+
+void TextEditModel::selectWordAt(int index) {
+  const int len = length();
+  if (len == 0) {
+    clearSelection();
+    return;
+  }
+  if (isMasked()) {
+    select(0, len);
+    return;
+  }
+  const int at = std::clamp(index, 0, len - 1);
+  const wchar_t ch = text_[at];
+  int start = at;
+  while (start > 0 && CharClassifier::sameCharType(text_[start - 1], ch)) --start;
+  int end = at + 1;
+  while (end < len && CharClassifier::sameCharType(text_[end], ch)) ++end;
+  select(start, end);
 }
 
 void TextEditModel::dragTo(int index) {
   if (selStart_ < 0 || selEnd_ != caret_) return;
-  caret_ = selEnd_ = clampIndex(index);
+  setCaret(index);
+  selEnd_ = caret_;
 }
 
 void TextEditModel::highlightAll(bool on) {
@@ -97,7 +135,7 @@ void TextEditModel::highlightAll(bool on) {
     clearSelection();
     return;
   }
-  caret_ = length();
+  moveCaret(SeekMethod::EndOfText);
   if (text_.empty()) {
     clearSelection();
   } else {
@@ -107,7 +145,8 @@ void TextEditModel::highlightAll(bool on) {
 }
 
 wchar_t TextEditModel::characterAtCaret() const {
-  return caret_ < length() ? text_[caret_] : L' ';
+  if (caret_ >= length()) return L' ';
+  return isMasked() ? mask_ : text_[caret_];
 }
 
 // --- Settings ---
@@ -131,14 +170,10 @@ bool TextEditModel::isRestricted(wchar_t ch) const {
 
 bool TextEditModel::isAllowed(wchar_t ch) const {
   if (!CharClassifier::isPrintable(ch) || isRestricted(ch)) return false;
-  if (sizeLimit_ == 0) return true;
-  // Judged as paste judges it: by the length once the text that the character replaces is gone.
-  std::size_t replaced = 0;
-  if (hasSelection()) {
-    replaced = selectionHigh() - selectionLow();
-  } else if (mode_ == EditMode::Overwrite && caret_ < length()) {
-    replaced = 1;
-  }
+  if (sizeLimit_ == 0 || mode_ == EditMode::Overwrite) return true;
+  // Judged as paste judges it: by the length once the selection that the character replaces
+  // is gone.
+  const std::size_t replaced = hasSelection() ? selectionHigh() - selectionLow() : 0;
   return text_.size() - replaced < sizeLimit_;
 }
 
@@ -152,7 +187,7 @@ void TextEditModel::applyReplace(std::size_t pos, std::size_t removeCount, const
 }
 
 bool TextEditModel::addCharacter(wchar_t ch) {
-  if (!isAllowed(ch)) return false;
+  if (!allows(ch)) return false;
   if (mode_ == EditMode::Overwrite && !hasSelection() && caret_ < length()) {
     return replaceRange(caret_, seek(SeekMethod::NextChar, caret_), WString(1, ch));
   }
@@ -172,33 +207,46 @@ bool TextEditModel::replaceRange(int from, int to, const WString& s) {
   item.position = from;
   item.removed = text_.substr(from, to - from);
 
-  // Every character is judged against the text as it stands once the replaced text is gone,
-  // so a paste that starts short of the limit goes in whole.
-  const std::size_t lengthAfterErase = text_.size() - item.removed.size();
-  const bool room = sizeLimit_ == 0 || lengthAfterErase < sizeLimit_;
-  if (room) {
-    std::size_t end = s.size();
-    while (end > 0 && CharClassifier::isLineBreak(s[end - 1])) --end;
-    const std::size_t capacity = kMaxLength - lengthAfterErase;
-    item.inserted.reserve(std::min(end, capacity));
-    for (std::size_t i = 0; i < end && item.inserted.size() < capacity; ++i) {
-      wchar_t ch = s[i];
-      if (CharClassifier::isLineBreak(ch)) {
-        if (ch == L'\r' && i + 1 < end && s[i + 1] == L'\n') ++i;
-        ch = L' ';
-      }
-      if (CharClassifier::isPrintable(ch) && !isRestricted(ch)) item.inserted += ch;
-    }
+  // The replaced text goes first, so that the filter judges every character against the text
+  // that it will join.
+  if (!item.removed.empty()) {
+    applyReplace(item.position, item.removed.size(), {});
+    clearSelection();
+    moveCaret(SeekMethod::ToIndex, item.position);
   }
+  item.inserted = keptCharacters(s);
   if (item.removed.empty() && item.inserted.empty()) return false;
 
-  applyReplace(item.position, item.removed.size(), item.inserted);
-  caret_ = item.position + static_cast<int>(item.inserted.size());
   clearSelection();
   modified_ = true;
+  if (!item.inserted.empty()) {
+    applyReplace(item.position, 0, item.inserted);
+    if (item.inserted.size() == 1) {
+      moveCaret(SeekMethod::NextChar);
+    } else {
+      moveCaret(SeekMethod::ToIndex, item.position + static_cast<int>(item.inserted.size()));
+    }
+  }
   item.caretAfter = caret_;
   history_.record(std::move(item));
   return true;
+}
+
+WString TextEditModel::keptCharacters(const WString& s) const {
+  std::size_t end = s.size();
+  while (end > 0 && CharClassifier::isLineBreak(s[end - 1])) --end;
+  const std::size_t capacity = kMaxLength - text_.size();
+  WString kept;
+  kept.reserve(std::min(end, capacity));
+  for (std::size_t i = 0; i < end && kept.size() < capacity; ++i) {
+    wchar_t ch = s[i];
+    if (CharClassifier::isLineBreak(ch)) {
+      if (ch == L'\r' && i + 1 < end && s[i + 1] == L'\n') ++i;
+      ch = L' ';
+    }
+    if (allows(ch)) kept += ch;
+  }
+  return kept;
 }
 
 bool TextEditModel::pasteUtf8(std::string_view bytes) {
@@ -220,10 +268,11 @@ bool TextEditModel::erase(int from, int to, bool undoable) {
     item.caretAfter = lo;
   }
   applyReplace(lo, hi - lo, {});
-  caret_ = lo;
   clearSelection();
   modified_ = true;
+  moveCaret(SeekMethod::ToIndex, lo);
   if (undoable) {
+    item.caretAfter = caret_;
     history_.record(std::move(item));
   } else {
     history_.clear();  // the recorded positions no longer fit the text
@@ -267,11 +316,12 @@ void TextEditModel::revertGroup(std::span<const Item> items) {
   } else {
     for (const Item& item : items) applyReplace(item.position, item.inserted.size(), item.removed);
   }
-  caret_ = clampIndex(oldest.caretBefore);
+  clearSelection();
+  modified_ = true;
+  setCaret(oldest.caretBefore);
   selStart_ = oldest.selectionStartBefore < 0 ? -1 : clampIndex(oldest.selectionStartBefore);
   selEnd_ = oldest.selectionEndBefore < 0 ? -1 : clampIndex(oldest.selectionEndBefore);
   if (selStart_ < 0 || selEnd_ < 0) clearSelection();
-  modified_ = true;
 }
 
 void TextEditModel::replayGroup(std::span<const Item> items) {
@@ -285,9 +335,9 @@ void TextEditModel::replayGroup(std::span<const Item> items) {
       applyReplace(it->position, it->removed.size(), it->inserted);
     }
   }
-  caret_ = clampIndex(items.front().caretAfter);
   clearSelection();
   modified_ = true;
+  setCaret(items.front().caretAfter);
 }
 
 bool TextEditModel::undo() {
@@ -338,7 +388,7 @@ bool TextEditModel::handleKey(unsigned key) {
   if (isCharacterKey(key)) {
     const auto ch = static_cast<wchar_t>(key & kCharacterMask);
     if (CharClassifier::isPrintable(ch)) {
-      if (isAllowed(ch)) {
+      if (allows(ch)) {
         addCharacter(ch);
         return true;
       }
@@ -378,19 +428,18 @@ bool TextEditModel::eraseKey(bool forward, bool ctrl) {
 
 bool TextEditModel::handleCaretKey(unsigned code, bool ctrl, bool shift) {
   if (shift && !hasSelection()) anchorSelection();
-  const int len = length();
   switch (code) {
     case kKeyHome:
-      if (caret_ > 0) moveCaret(SeekMethod::StartOfText);
+      moveCaret(SeekMethod::StartOfText);
       break;
     case kKeyLeft:
-      if (caret_ > 0) moveCaret(ctrl ? SeekMethod::PreviousWord : SeekMethod::PreviousChar);
+      moveCaret(ctrl ? SeekMethod::PreviousWord : SeekMethod::PreviousChar);
       break;
     case kKeyRight:
-      if (caret_ < len) moveCaret(ctrl ? SeekMethod::NextWord : SeekMethod::NextChar);
+      moveCaret(ctrl ? SeekMethod::NextWord : SeekMethod::NextChar);
       break;
     case kKeyEnd:
-      if (caret_ < len) moveCaret(SeekMethod::EndOfText);
+      moveCaret(SeekMethod::EndOfText);
       break;
     default:
       return false;

@@ -11,23 +11,36 @@
 //
 // Decisions where the text box leaves room:
 //   - Printable means `CharClassifier::isPrintable`, a fixed table independent of the locale.
-//   - The size limit is judged on the length once the text that an edit replaces is gone (the
-//     selection, or in overwrite mode the character after the caret): a typed character is
-//     refused when that length is at or above the limit. A paste that starts short of the limit
-//     goes in whole and may overrun it; the text then takes no more characters, and a typed
-//     character that replaces one is refused until the text is back under the limit.
+//   - The owner's say (`setHooks`): a text box decides which characters go in and carries out
+//     every caret move itself. Every character that typing or a paste would insert is put to
+//     the character hook; every caret move that an edit, a key, an undo or a selection makes is
+//     put to the caret hook, once per change: a move that would leave the caret where it is is
+//     not made. Whatever the hook does, the caret stays within the text.
+//   - Paste removes the text it replaces (the selection) first, moving the caret to where it
+//     stood, and then puts each of its characters to the filter against the text as it stands
+//     then, before any of them is inserted; so a paste that starts short of the limit goes in
+//     whole and may overrun it.
+//   - Size limit (`isAllowed`): a character is refused when a limit is set and the text, less
+//     the selection that the character replaces, is at or above it. In overwrite mode the limit
+//     does not apply at all: typing over the text or at its end may grow it past the limit.
 //   - Paste turns each line break (CR LF counts as one) into a space and drops line breaks at
 //     the end of the pasted text; then every character passes the filter as typing does
 //     (control characters and TAB are dropped). `pasteUtf8` decodes first: malformed bytes
 //     become U+FFFD, which is kept unless the filter refuses it.
 //   - A paste or erase that changes nothing records nothing and leaves `isModified` alone.
+//   - Masked text (`setMask`, the password display) has no words: word moves and word erases
+//     go to the ends of the text and a word selection takes all of it, and the overwrite
+//     caret's character is the mask, so that nothing shows where the hidden words break.
+//   - A word selection (double click) is the run of characters of one class, as word moves
+//     see them, that holds the character at the given index (the last one at the end).
 //   - `setText` is the owner setting the contents, so it clears the undo and redo lists (their
-//     positions describe the old text) and places the caret at the end.
+//     positions describe the old text) and places the caret at the end (or the start).
 //   - Escape is undoable: it records only the stretch where the text and the saved text
 //     differ. With nothing saved yet, Escape is not handled and travels on to the owner.
 //   - After Escape everything stays selected; only the caret keys collapse or extend the
 //     selection afterwards.
 #include <cstdint>
+#include <functional>
 #include <string_view>
 #include <utility>
 
@@ -63,10 +76,10 @@ class TextEditModel {
   // Text between two positions in either order; empty for a negative position or an empty
   // range. Positions past the end are taken as the end.
   WString textRange(int from, int to) const;
-  // Replaces the contents and the saved text, caret to the end, no selection, not modified,
-  // no undo or redo. Returns false (and changes nothing) when the text, the saved text and the
-  // unmodified state are already so.
-  bool setText(const WString& text);
+  // Replaces the contents and the saved text, caret to `caretTo` (the end or the start), no
+  // selection, not modified, no undo or redo. Returns false (and changes nothing) when the
+  // text, the saved text and the unmodified state are already so.
+  bool setText(const WString& text, SeekMethod caretTo = SeekMethod::EndOfText);
   // Counts every change of the text, so that a caller can tell whether a key changed it
   // without keeping a copy.
   std::uint64_t revision() const { return revision_; }
@@ -93,12 +106,20 @@ class TextEditModel {
 
   // Where a seek from `from` lands; `index` is used by ToIndex only. Always within the text.
   int seek(SeekMethod method, int from, int index = 0) const;
-  // Moves the caret; the selection is left alone.
+  // Moves the caret through the caret hook (see the decisions above); the selection is left
+  // alone.
   void moveCaret(SeekMethod method, int index = 0);
   void setCaret(int index) { moveCaret(SeekMethod::ToIndex, index); }
+  // Carries a caret move out: where the caret hook ends up. Nothing else calls it.
+  void applyCaretMove(SeekMethod method, int index = 0);
   // Selects from `anchor` to `caret` (clamped to the text) and puts the caret at `caret`.
   // Refused (false, nothing changes) for a negative position.
   bool select(int anchor, int caret);
+  // Shift and a click: from the selection's anchor (the caret when there is none) to `index`.
+  void extendSelectionTo(int index);
+  // A double click: selects the word that holds the character at `index` (see the decisions
+  // above), the caret at its end. Nothing is selected in an empty text.
+  void selectWordAt(int index);
   // An empty selection at the caret, from which a drag or Shift extends.
   void anchorSelection() { selStart_ = selEnd_ = caret_; }
   void clearSelection() { selStart_ = selEnd_ = -1; }
@@ -107,7 +128,8 @@ class TextEditModel {
   // With true: caret to the end and, when there is text, everything selected. With false:
   // the selection is cleared.
   void highlightAll(bool on);
-  // The character under the caret for the overwrite caret: a space at the end of the text.
+  // The character under the caret for the overwrite caret: a space at the end of the text,
+  // the mask over masked text.
   wchar_t characterAtCaret() const;
 
   // --- Settings ---
@@ -120,11 +142,25 @@ class TextEditModel {
   void setSizeLimit(std::uint64_t limit) { sizeLimit_ = limit; }
   std::uint64_t sizeLimit() const { return sizeLimit_; }
 
+  // The character that stands for every character of the text on screen; 0 for none.
+  void setMask(wchar_t mask) { mask_ = mask; }
+  wchar_t mask() const { return mask_; }
+  bool isMasked() const { return mask_ != 0; }
+
   // True when the filter refuses the character.
   bool isRestricted(wchar_t ch) const;
   // True when typing the character now would be accepted: printable, not TAB, not restricted,
   // and the size limit leaves room (see the decisions above).
   bool isAllowed(wchar_t ch) const;
+
+  // --- The owner's say ---
+  struct Hooks {
+    // Whether a character may go in; without it, isAllowed.
+    std::function<bool(wchar_t)> allows;
+    // Carries out a caret move; it should end in applyCaretMove. Without it, applyCaretMove.
+    std::function<void(SeekMethod, int)> moveCaret;
+  };
+  void setHooks(Hooks hooks) { hooks_ = std::move(hooks); }
 
   // --- Editing ---
   // Types one character: in overwrite mode with no selection it replaces the character after
@@ -166,9 +202,12 @@ class TextEditModel {
   bool handleCaretKey(unsigned code, bool ctrl, bool shift);
   bool eraseKey(bool forward, bool ctrl);
 
+  bool allows(wchar_t ch) const { return hooks_.allows ? hooks_.allows(ch) : isAllowed(ch); }
   // Replaces [from, to) by the characters of `s` that the filter and the limit keep, with an
   // undo item; the caret and selection at the call are the item's state before.
   bool replaceRange(int from, int to, const WString& s);
+  // The characters of `s` that go in, judged against the text as it stands.
+  WString keptCharacters(const WString& s) const;
   void applyReplace(std::size_t pos, std::size_t removeCount, const WString& insert);
   void revertGroup(std::span<const EditHistory::Item> items);
   void replayGroup(std::span<const EditHistory::Item> items);
@@ -189,6 +228,8 @@ class TextEditModel {
   WString charSet_;
   CharacterRestriction restriction_ = CharacterRestriction::None;
   std::uint64_t sizeLimit_ = 0;
+  wchar_t mask_ = 0;
 
   EditHistory history_;
+  Hooks hooks_;
 };

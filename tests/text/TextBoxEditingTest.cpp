@@ -94,10 +94,28 @@ TEST_F(TextBoxFixture, SizeLimitLetsAPasteOverrunThenRefusesTypingWithoutConsumi
   h.type(L"f");
   EXPECT_EQ(box->getText(), L"abcde");
   EXPECT_EQ(owner->keysReceived, std::vector<unsigned>{'f'});
-  // Overwrite mode replaces a character, so it may type at the limit only when under it.
+}
+
+TEST_F(TextBoxFixture, OverwriteModeLiftsTheSizeLimitEvenAtTheEnd) {
+  TextBox::InitArgs args;
+  args.sizeLimit = 3;
+  TextBox* box = focusedBox(L"abc", args);
   box->setEditMode(TextBoxBase::EditOverwrite);
   h.key(kHome);
-  EXPECT_FALSE(box->isAllowed(L'z'));
+  h.type(L"XY");
+  EXPECT_EQ(box->getText(), L"XYc");
+  h.key(kEnd);
+  h.type(L"de");
+  EXPECT_EQ(box->getText(), L"XYcde");
+  clipboard.setText(L"fg");
+  h.key(kCtrlV);
+  EXPECT_EQ(box->getText(), L"XYcdefg");
+  EXPECT_TRUE(owner->keysReceived.empty());
+  // Back in insert mode the limit holds again.
+  box->setEditMode(TextBoxBase::EditInsert);
+  h.type(L"h");
+  EXPECT_EQ(box->getText(), L"XYcdefg");
+  EXPECT_EQ(owner->keysReceived, std::vector<unsigned>{'h'});
 }
 
 TEST_F(TextBoxFixture, CopyAndCutWithoutSelectionTakeTheWholeText) {
@@ -153,7 +171,7 @@ TEST_F(TextBoxFixture, UndoTakesTypingBackWordByWordAndRedoReplaysIt) {
   EXPECT_EQ(box->getText(), L"ab ");
   h.key(kCtrlZ);
   EXPECT_EQ(box->getText(), L"ab");
-  h.key(0x04000008);  // Alt+Backspace undoes too
+  h.key(TextBoxBase::kKeyAltBackspace);  // Alt+Backspace undoes too
   EXPECT_EQ(box->getText(), L"");
   h.key(kCtrlZ);  // nothing left
   EXPECT_EQ(box->getText(), L"");
@@ -283,4 +301,106 @@ TEST_F(TextBoxFixture, PastedControlCharactersAreDroppedAndLineBreaksBecomeSpace
                     L'\0' + L"e\n\n");
   h.key(kCtrlV);
   EXPECT_EQ(box->getText(), L"abc de");
+}
+
+namespace {
+
+// A box that refuses 'x' on top of the usual rules, as a subclass with its own filter would.
+class NoExBox : public TextBox {
+ public:
+  using TextBox::TextBox;
+  bool isAllowed(wchar_t ch) const override { return ch != L'x' && TextBox::isAllowed(ch); }
+};
+
+// A box that logs every caret move it is asked to make, as the value box will watch them.
+class CaretWatchingBox : public TextBox {
+ public:
+  using TextBox::TextBox;
+  struct Move {
+    int before, after;
+  };
+  std::vector<Move> moves;
+
+ protected:
+  void updateCurrentPosition(Glib::iFont::eCharSeekMethod method, int index) override {
+    const int before = model().caret();
+    TextBox::updateCurrentPosition(method, index);
+    moves.push_back({before, model().caret()});
+  }
+};
+
+}  // namespace
+
+TEST_F(TextBoxFixture, TypingPasteAndComposedTextAllPassTheBoxsOwnFilter) {
+  TextBox::InitArgs args;
+  args.info = GlobCreationInfo(200, 24, owner->canvas(), 10, 10);
+  auto* box = new NoExBox(args);
+  box->set_kbd_focus();
+  h.type(L"axb");
+  EXPECT_EQ(box->getText(), L"ab");
+  clipboard.setText(L"xyx");
+  h.key(kCtrlV);
+  EXPECT_EQ(box->getText(), L"aby");
+  Event e(kEventMessage);
+  e.message(kMsgCompoundTextInput);
+  e.setPayload("x1x");
+  e.dest = box;
+  event_send(&e, false);
+  EXPECT_EQ(box->getText(), L"aby1");
+  // Overwriting goes through the same gate.
+  box->setEditMode(TextBoxBase::EditOverwrite);
+  h.key(kHome);
+  h.type(L"xz");
+  EXPECT_EQ(box->getText(), L"zby1");
+}
+
+TEST_F(TextBoxFixture, EveryCaretMoveGoesThroughUpdateCurrentPositionOnce) {
+  TextBox::InitArgs args;
+  args.info = GlobCreationInfo(300, 24, owner->canvas(), 10, 10);
+  args.text = L"alpha beta";
+  auto* box = new CaretWatchingBox(args);
+  std::size_t seen = 0;
+  int caret = box->model().caret();
+  // Since the last look, the moves chain from the caret as it was to the caret as it is, and
+  // each of them changed it.
+  auto movesChain = [&](const char* what) {
+    SCOPED_TRACE(what);
+    const std::size_t before = seen;
+    for (; seen < box->moves.size(); ++seen) {
+      EXPECT_EQ(box->moves[seen].before, caret);
+      EXPECT_NE(box->moves[seen].before, box->moves[seen].after);
+      caret = box->moves[seen].after;
+    }
+    EXPECT_EQ(caret, box->model().caret());
+    return seen - before;
+  };
+
+  h.clickOn(*box);  // takes the focus: caret to the end
+  EXPECT_EQ(movesChain("focus"), 1u);
+  h.key(kEnd);  // already there: only the selection goes
+  h.type(L"!?");
+  EXPECT_EQ(movesChain("typing"), 2u);
+  h.key(kLeft);
+  h.key(kLeft | kKeyCtrl);
+  h.key(kHome);
+  h.key(kHome);  // already at the start: no move
+  EXPECT_EQ(movesChain("caret keys"), 3u);
+  h.key(kEnd | kKeyShift);
+  h.key(kBackspace);
+  EXPECT_EQ(movesChain("select and erase"), 2u);
+  clipboard.setText(L"pasted");
+  h.key(kCtrlV);
+  h.key(kCtrlZ);
+  h.key(kCtrlY);
+  h.key(kEscape);
+  movesChain("clipboard, undo, redo and Escape");
+  h.advance(1000);
+  h.click(pointOnCharacter(*box, 3));
+  h.drag(pointOnCharacter(*box, 1), pointOnCharacter(*box, 6));
+  movesChain("click and drag");
+  box->setCursorPosition(TextBox::CursorAtEnd);
+  box->setText(L"new");
+  owner->set_kbd_focus();
+  movesChain("owner calls and focus loss");
+  EXPECT_GT(seen, 12u);
 }

@@ -10,7 +10,8 @@
 #include "platform/testing/MessageProbe.h"
 #include "text/TextBox.h"
 
-// Records the messages and the key presses that reach it (keys the boxes did not consume).
+// Records the messages, the key presses and the mouse presses that reach it (those the boxes
+// did not consume).
 class BoxOwner : public MessageProbe {
  public:
   using MessageProbe::MessageProbe;
@@ -19,9 +20,14 @@ class BoxOwner : public MessageProbe {
       keysReceived.push_back(e->keyCode());
       return 1;
     }
+    if (mouse_event(e) && mouse_down_event(e)) {
+      ++pressesReceived;
+      return 1;
+    }
     return MessageProbe::react(e);
   }
   std::vector<unsigned> keysReceived;
+  int pressesReceived = 0;
 };
 
 class TextBoxFixture : public ::testing::Test {
@@ -31,10 +37,11 @@ class TextBoxFixture : public ::testing::Test {
   static constexpr unsigned kCtrlC = TextBoxBase::kKeyCopy;
   static constexpr unsigned kCtrlX = TextBoxBase::kKeyCut;
   static constexpr unsigned kCtrlV = TextBoxBase::kKeyPaste;
-  static constexpr unsigned kEnter = 13;
-  static constexpr unsigned kEscape = 27;
-  static constexpr unsigned kTab = 9;
-  static constexpr unsigned kBackspace = 8;
+  static constexpr unsigned kCtrlA = TextBoxBase::kKeySelectAll;
+  static constexpr unsigned kEnter = kKeyReturn;
+  static constexpr unsigned kEscape = kKeyEscape;
+  static constexpr unsigned kTab = kKeyTab;
+  static constexpr unsigned kBackspace = kKeyBackspace;
   static constexpr unsigned kHome = kKeyHome;
   static constexpr unsigned kLeft = kKeyLeft;
   static constexpr unsigned kRight = kKeyRight;
@@ -61,6 +68,16 @@ class TextBoxFixture : public ::testing::Test {
     h.pump();
     owner->clear();
     return box;
+  }
+  // The root x of the caret position before character `index`.
+  static int rootXOf(const TextBox& box, int index) {
+    return static_cast<int>(box.get_x()) + box.textX() + static_cast<int>(box.ruler().xOf(index)) -
+           box.scrollOffset();
+  }
+  // The root point in the middle of character `index`, half way up the box.
+  static XY<int> pointOnCharacter(const TextBox& box, int index) {
+    return XY<int>((rootXOf(box, index) + rootXOf(box, index + 1)) / 2,
+                   static_cast<int>(box.get_y() + box.height() / 2));
   }
   // The messages the owner received since the last clear, after the queue has run.
   std::vector<String> events() {

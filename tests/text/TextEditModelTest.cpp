@@ -40,7 +40,7 @@ TEST(TextEditModel, CaretKeysStayInsideTheTextAndOtherKeysTravelOn) {
   }
   const auto revision = m.revision();
   for (unsigned key :
-       {kKeyTab, kKeyReturn, kKeyShift | kKeyTab, kKeyAlt | kLeft, kKeyCtrl | 0x41u, 0x08000048u}) {
+       {kKeyTab, kKeyReturn, kKeyShift | kKeyTab, kKeyAlt | kLeft, kKeyCtrl | 'A', kKeyUp}) {
     EXPECT_FALSE(m.handleKey(key)) << std::hex << key;
   }
   EXPECT_EQ(m.revision(), revision);
@@ -162,17 +162,114 @@ TEST(TextEditModel, SizeLimitOnTypingAndPaste) {
   m.select(0, 3);
   EXPECT_TRUE(m.handleKey(L'A'));
   EXPECT_EQ(m.text(), L"Ade");
-  // Overwrite replaces inside a full text but cannot grow it at the end.
-  m.setEditMode(Model::EditMode::Overwrite);
-  m.setCaret(1);
-  EXPECT_TRUE(m.handleKey(L'B'));
-  EXPECT_EQ(m.text(), L"ABe");
-  m.setCaret(3);
-  EXPECT_FALSE(m.handleKey(L'F'));
   m.setSizeLimit(2);
   m.select(1, 3);
   EXPECT_TRUE(m.paste(L"xyz"));  // judged after the selection is gone
   EXPECT_EQ(m.text(), L"Axyz");
+  // Overwrite mode lifts the limit: over the text and past its end alike.
+  m.setEditMode(Model::EditMode::Overwrite);
+  m.setCaret(1);
+  EXPECT_TRUE(m.handleKey(L'B'));
+  EXPECT_EQ(m.text(), L"AByz");
+  m.handleKey(kEnd);
+  EXPECT_TRUE(m.handleKey(L'!'));
+  EXPECT_TRUE(m.paste(L"??"));
+  EXPECT_EQ(m.text(), L"AByz!??");
+}
+
+TEST(TextEditModel, HooksSeeEveryCharacterAndEveryCaretMoveOnce) {
+  Model m = withText(L"one two", 7);
+  std::vector<std::pair<int, int>> moves;  // (caret before, caret after) of each hook call
+  WString asked;
+  Model::Hooks hooks;
+  hooks.allows = [&](wchar_t ch) {
+    asked += ch;
+    return ch != L'x' && m.isAllowed(ch);
+  };
+  hooks.moveCaret = [&](Model::SeekMethod method, int index) {
+    const int before = m.caret();
+    m.applyCaretMove(method, index);
+    moves.emplace_back(before, m.caret());
+  };
+  m.setHooks(hooks);
+
+  // Every path that inserts asks about each character, and every move is seen once, from
+  // where the caret stood.
+  type(m, L"ax");
+  EXPECT_TRUE(m.paste(L"bxc"));
+  EXPECT_EQ(m.text(), L"one twoabc");
+  EXPECT_NE(asked.find(L"bxc"), WString::npos);
+  m.handleKey(kLeft | kKeyCtrl);
+  m.handleKey(kEnd);
+  m.handleKey(kEnd);  // already there: no move
+  m.handleKey(kBackspace);
+  m.select(0, 3);
+  m.paste(L"ONE");  // the selection goes first, then the caret follows the insert
+  m.undo();
+  m.setText(L"new", Model::SeekMethod::StartOfText);
+  const std::vector<std::pair<int, int>> expected = {{7, 8}, {8, 10}, {10, 4}, {4, 10}, {10, 9},
+                                                     {9, 3}, {3, 0},  {0, 3},  {3, 0}};
+  EXPECT_EQ(moves, expected);
+  EXPECT_EQ(m.caret(), 0);
+
+  // A hook that refuses a move leaves the caret inside the text all the same.
+  m.setHooks({nullptr, [](Model::SeekMethod, int) {}});
+  m.setCaret(2);
+  EXPECT_EQ(m.caret(), 0);
+  m.setText(L"");
+  EXPECT_EQ(m.caret(), 0);
+}
+
+TEST(TextEditModel, MaskedTextHasNoWords) {
+  Model m = withText(L"my secret-word", 14);
+  m.setMask(L'*');
+  m.handleKey(kLeft | kKeyCtrl);
+  EXPECT_EQ(m.caret(), 0);
+  m.handleKey(kRight | kKeyCtrl);
+  EXPECT_EQ(m.caret(), 14);
+  m.handleKey(kLeft);
+  m.handleKey(kLeft | kKeyShift | kKeyCtrl);
+  EXPECT_EQ(m.selectionLow(), 0);
+  m.selectWordAt(4);
+  EXPECT_EQ(m.selectedText(), L"my secret-word");
+  m.clearSelection();
+  m.setCaret(3);
+  EXPECT_EQ(m.characterAtCaret(), L'*');
+  EXPECT_TRUE(m.handleKey(kDelete | kKeyCtrl));
+  EXPECT_EQ(m.text(), L"my ");
+  EXPECT_TRUE(m.handleKey(kBackspace | kKeyCtrl));
+  EXPECT_TRUE(m.isEmpty());
+
+  // Unmasked, the same text has its words back.
+  Model plain = withText(L"my secret-word", 0);
+  plain.selectWordAt(4);
+  EXPECT_EQ(plain.selectedText(), L"secret");
+  EXPECT_EQ(plain.caret(), 9);
+  EXPECT_EQ(plain.characterAtCaret(), L'-');
+}
+
+TEST(TextEditModel, WordSelectionAndShiftExtension) {
+  Model m = withText(L"alpha  beta,gamma", 0);
+  const std::pair<int, const wchar_t*> words[] = {{0, L"alpha"}, {4, L"alpha"}, {5, L"  "},
+                                                  {8, L"beta"},  {11, L","},    {17, L"gamma"}};
+  for (auto [index, word] : words) {
+    m.selectWordAt(index);
+    EXPECT_EQ(m.selectedText(), word) << index;
+  }
+  // The word's start is the anchor that Shift extends from, in either direction.
+  m.selectWordAt(8);
+  m.extendSelectionTo(15);
+  EXPECT_EQ(m.selectedText(), L"beta,gam");
+  m.extendSelectionTo(2);
+  EXPECT_EQ(m.selectedText(), L"pha  ");
+  EXPECT_EQ(m.caret(), 2);
+  // With no selection the caret is the anchor.
+  m.clearSelection();
+  m.extendSelectionTo(0);
+  EXPECT_EQ(m.selectedText(), L"al");
+  Model empty;
+  empty.selectWordAt(0);
+  EXPECT_FALSE(empty.hasSelection());
 }
 
 TEST(TextEditModel, HugePasteFollowsTheLimitAndCanBeSelectedCutAndUndone) {
