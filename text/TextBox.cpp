@@ -13,8 +13,6 @@
 
 namespace {
 
-constexpr unsigned kCharacterMask = 0x00FFFFFF;
-
 // One previous-click time for every box that is not editable.
 double gLastReadOnlyClick = -1e18;
 
@@ -24,11 +22,6 @@ double now() {
 
 int clampToInt(int64_t v) {
   return static_cast<int>(std::clamp<int64_t>(v, INT_MIN, INT_MAX));
-}
-
-// A bare character, possibly with Shift: what typing produces.
-bool isCharacterKey(unsigned key) {
-  return (key & ~kKeyShift & ~kCharacterMask) == 0;
 }
 
 }  // namespace
@@ -104,7 +97,7 @@ bool TextBox::isAllowed(wchar_t ch) const {
 }
 
 void TextBox::addCharacter(int ch) {
-  if (ch < 0 || static_cast<unsigned>(ch) > kCharacterMask) return;
+  if (ch < 0 || static_cast<unsigned>(ch) > kKeyCharacterMask) return;
   model_.addCharacter(static_cast<wchar_t>(ch));
   changed();
 }
@@ -175,8 +168,7 @@ int TextBox::handleKeyboardEvent(int keyCode) {
   noteKeyTime();
 
   int consumed = 0;
-  const auto ch = static_cast<wchar_t>(key & kCharacterMask);
-  if (isCharacterKey(key) && CharClassifier::isPrintable(ch)) {
+  if (const wchar_t ch = typedCharacter(key)) {
     if (isAllowed(ch)) {
       addCharacter(ch);
       consumed = 1;

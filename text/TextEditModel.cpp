@@ -2,14 +2,13 @@
 
 #include <algorithm>
 
-#include "platform/glob/Event.h"
+#include "platform/glob/KeyCodes.h"
 #include "platform/kw/CharClassifier.h"
 
 namespace {
 using Item = EditHistory::Item;
 using CharClass = CharClassifier::CharClass;
 
-constexpr unsigned kCharacterMask = 0x00FFFFFF;
 }  // namespace
 
 // --- Contents ---
@@ -378,24 +377,17 @@ bool TextEditModel::revertToSaved() {
 
 // --- Keys ---
 
-bool TextEditModel::isCharacterKey(unsigned key) {
-  return (key & ~kKeyShift & ~kCharacterMask) == 0;
-}
-
 bool TextEditModel::handleKey(unsigned key) {
   const bool shift = key & kKeyShift;
   const bool ctrl = key & kKeyCtrl;
-  if (isCharacterKey(key)) {
-    const auto ch = static_cast<wchar_t>(key & kCharacterMask);
-    if (CharClassifier::isPrintable(ch)) {
-      if (allows(ch)) {
-        addCharacter(ch);
-        return true;
-      }
-      // A character the filter refuses is swallowed; one refused only for want of room
-      // travels on to the owner.
-      return isRestricted(ch);
+  if (const wchar_t ch = typedCharacter(key)) {
+    if (allows(ch)) {
+      addCharacter(ch);
+      return true;
     }
+    // A character the filter refuses is swallowed; one refused only for want of room travels
+    // on to the owner.
+    return isRestricted(ch);
   }
   const unsigned code = key & ~(kKeyShift | kKeyCtrl);
   switch (code) {

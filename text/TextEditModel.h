@@ -198,7 +198,6 @@ class TextEditModel {
 
  private:
   // Decoded key code: the character or scan code with the Shift and Ctrl flags.
-  static bool isCharacterKey(unsigned key);
   bool handleCaretKey(unsigned code, bool ctrl, bool shift);
   bool eraseKey(bool forward, bool ctrl);
 

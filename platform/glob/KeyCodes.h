@@ -32,3 +32,11 @@ constexpr unsigned kKeyDown = kKeyScanCode | kScanDown;
 constexpr unsigned kKeyPageDown = kKeyScanCode | kScanPageDown;
 constexpr unsigned kKeyInsert = kKeyScanCode | kScanInsert;
 constexpr unsigned kKeyDelete = kKeyScanCode | kScanDelete;
+
+// The largest character a key code can carry in its low bits.
+constexpr unsigned kKeyCharacterMask = 0x00FFFFFF;
+
+// The character a key press types: a printable character with no modifier but Shift. 0 for
+// every other key (shortcuts with Ctrl or Alt, scan-code keys, control characters), so that
+// every control that takes typing decides the same way.
+wchar_t typedCharacter(unsigned keyCode);

@@ -6,6 +6,7 @@
 #include "buttons/Button.h"
 #include "foundation/TabOrderManager.h"
 #include "platform/glob/GlobHandle.h"
+#include "platform/glob/KeyCodes.h"
 #include "platform/misc/Diagnostics.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
@@ -101,7 +102,7 @@ TEST_F(ButtonTest, PressureButtonReportsPressAndRelease) {
   EXPECT_EQ(b->get_pressure(), -1);
   // While tracked, everything but the left button is swallowed: keys and ticks do nothing.
   b->set_kbd_focus();
-  h.key(13);
+  h.key(kKeyReturn);
   EXPECT_EQ(parent.texts(), Texts{"p pressed"});
   h.release(centre(*b));
   EXPECT_EQ(b->get_pressure(), 1);
@@ -191,30 +192,30 @@ TEST_F(ButtonTest, RepeatsFromTheClockWhileHeld) {
 TEST_F(ButtonTest, ReturnAndSpaceActivateOnce) {
   Button* b = make("go");
   b->set_kbd_focus();
-  h.key(13);
+  h.key(kKeyReturn);
   EXPECT_EQ(parent.texts(), Texts{"go"});
   EXPECT_EQ(b->get_state(), kButtonUp);
-  h.key(32);
+  h.key(kKeySpace);
   EXPECT_EQ(parent.texts(), (Texts{"go", "go"}));
 
   // Other keys, and Return with a modifier, go on to the parent without a report.
   h.key('a');
   h.setModifiers(kKeyCtrl);
-  h.key(13);
+  h.key(kKeyReturn);
   h.setModifiers(0);
   EXPECT_EQ(parent.count("go"), 2);
 
   Button* latch = make("l", 100, 20);
   latch->set_latching(true);
   latch->set_kbd_focus();
-  h.key(32);
+  h.key(kKeySpace);
   EXPECT_EQ(latch->get_state(), kButtonDown);
 
   Button* pressure = make("p", 180, 20);
   pressure->set_pressure_button(1);
   pressure->set_kbd_focus();
   parent.clear();
-  h.key(13);
+  h.key(kKeyReturn);
   EXPECT_EQ(parent.texts(), (Texts{"p pressed", "p released"}));
   EXPECT_EQ(pressure->get_pressure(), 1);
 }
@@ -420,7 +421,7 @@ TEST_F(ButtonTest, TabStopsFollowActivityAndHandFocusBack) {
 
   m.incrementTabStop();
   EXPECT_EQ(h.root().focus(), a);
-  h.key(13);
+  h.key(kKeyReturn);
   EXPECT_EQ(parent.texts(), Texts{"a"});
 
   // An inactive or hidden button is skipped.
@@ -459,7 +460,7 @@ TEST_F(ButtonTest, ButtonDeletedByItsOwnReportIsNotTouched) {
       {"keyboard", [](Button*) {}, "x",
        [](Harness& h, Button* b) {
          b->set_kbd_focus();
-         h.key(32);
+         h.key(kKeySpace);
        }},
       {"repeat", [](Button* b) { b->set_repeating(10, 0.4); }, "x",
        [](Harness& h, Button* b) {

@@ -5,6 +5,7 @@
 #include "buttons/PootButton.h"
 #include "buttons/SettingsButton.h"
 #include "buttons/SizeButton.h"
+#include "platform/glob/KeyCodes.h"
 #include "platform/misc/ResourceStrings.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
@@ -77,7 +78,7 @@ TEST_F(TitleButtonsTest, SizeButtonFlipsBeforeReporting) {
 
   // Return flips once too; the release does not flip back.
   b->set_kbd_focus();
-  h.key(13);
+  h.key(kKeyReturn);
   EXPECT_EQ(b->getString(), L">");
   EXPECT_TRUE(b->get_size());
   EXPECT_EQ(p.count("minify"), 2);

@@ -95,9 +95,9 @@ TEST_F(BoxFixture, InactiveOrClickDisabledBoxIgnoresClicksButTogglesFromTheKeybo
   EXPECT_FALSE(box->getState());
 
   box->set_kbd_focus();
-  h.key(13);
+  h.key(kKeyReturn);
   EXPECT_TRUE(box->getState());
-  h.key(32);
+  h.key(kKeySpace);
   EXPECT_FALSE(box->getState());
   EXPECT_EQ(panel.texts(), (std::vector<String>{"Checkbox TICKED", "Checkbox CLEAR"}));
 
@@ -116,7 +116,7 @@ TEST_F(BoxFixture, UserFunctionDecidesInsteadOfToggling) {
   box->setUserFunction(&countCall, &seen);
   h.clickOn(*box);
   box->set_kbd_focus();
-  h.key(32);
+  h.key(kKeySpace);
   EXPECT_EQ(calls, 2);
   EXPECT_EQ(seen, nullptr);  // the function got its data
   EXPECT_FALSE(box->getState());
@@ -257,9 +257,9 @@ TEST_F(BoxFixture, TabMovesFocusBetweenBoxesAndLosingItReturnsFocusToTheParent) 
   host.addWidget(second, 5, 40);
   ASSERT_TRUE(host.incrementTab());
   EXPECT_EQ(h.root().focus(), first);
-  h.key(9);
+  h.key(kKeyTab);
   EXPECT_EQ(h.root().focus(), second);
-  h.key(32);
+  h.key(kKeySpace);
   EXPECT_TRUE(second->getState());
   second->handleTabStopFocusLoss();
   EXPECT_EQ(h.root().focus(), &host);

@@ -260,7 +260,7 @@ TEST_F(CheckboxSetFixture, ClickSelectsClearsThePreviousAndCallsTheParent) {
   h.clickOn(*set->member(2));  // the selected box cannot be clicked off
   EXPECT_TRUE(set->member(2)->getState());
   set->member(2)->set_kbd_focus();
-  h.key(32);  // nor turned off from the keyboard
+  h.key(kKeySpace);  // nor turned off from the keyboard
   EXPECT_TRUE(set->member(2)->getState());
   EXPECT_EQ(spy.texts.size(), 1u);
 }
@@ -352,7 +352,7 @@ TEST_F(RadioFixture, BoolSetKeepsOneBoxTickedAndWritesTheModel) {
 
   h.clickOn(*no);  // the ticked box stays ticked
   no->set_kbd_focus();
-  h.key(13);
+  h.key(kKeyReturn);
   EXPECT_TRUE(no->getState());
   EXPECT_EQ(owner.messages().size(), 1u);
 
