@@ -1,11 +1,12 @@
 #include "text/TextBoxBase.h"
 
 #include "platform/glib/FontCache.h"
+#include "platform/glib/look/TextFieldLook.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/glob/RuntimeClock.h"
+#include "platform/kw/CharClassifier.h"
 #include "platform/kw/String.h"
 #include "platform/misc/WindowsClipboard.h"
-#include "platform/kw/CharClassifier.h"
 
 const char* const TextBoxBase::copyMsg = "Copy";
 const char* const TextBoxBase::cutMsg = "Cut";
@@ -86,7 +87,7 @@ Colour TextBoxBase::getCaretColour() const {
 }
 
 Colour TextBoxBase::getTextColour() const {
-  return getPalette().get(isActive() ? Palette::Text : Palette::Disabled);
+  return Glib::TextFieldLook(getPalette()).text(isActive());
 }
 
 void TextBoxBase::clearChanged() {
