@@ -1,6 +1,7 @@
 #include "platform/glib/look/MarkLook.h"
 
 #include <algorithm>
+#include <cmath>
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
@@ -14,7 +15,18 @@ Kw::Box<int> inset(const Kw::Box<int>& b, int d) {
   return Kw::Box<int>(b.x0 + d, b.y0 + d, b.x1 - d, b.y1 - d);
 }
 
+double luminance(const Colour& c) {
+  return 0.2126 * c.r + 0.7152 * c.g + 0.0722 * c.b;
+}
+
 }  // namespace
+
+Colour MarkLook::knob() const {
+  const double well = luminance(palette_.get(Palette::Base));
+  const Colour& light = palette_.get(Palette::Light);
+  const Colour& shadow = palette_.get(Palette::Shadow);
+  return std::abs(luminance(light) - well) >= std::abs(luminance(shadow) - well) ? light : shadow;
+}
 
 Colour MarkLook::label(const Colour& text, bool active) const {
   return active ? text : palette_.get(Palette::Disabled);
@@ -58,7 +70,7 @@ void MarkLook::mixedBar(Painter& p, const Kw::Box<int>& box, bool active) const 
 void MarkLook::switchOff(Painter& p, const Kw::Box<int>& track, bool active) const {
   const Kw::Box<int> in = inset(track, kKnobInset);
   p.fillRect(Kw::Box<int>(in.x0, in.y0, in.x0 + in.height(), in.y1),
-             palette_.get(active ? Palette::Light : Palette::Disabled));
+             active ? knob() : palette_.get(Palette::Disabled));
 }
 
 void MarkLook::switchOn(Painter& p, const Kw::Box<int>& track, bool active) const {
@@ -74,7 +86,7 @@ void MarkLook::switchMixed(Painter& p, const Kw::Box<int>& track, const Colour& 
   const int k = in.height();
   const int x0 = in.x0 + (in.width() - k) / 2;
   p.fillRect(Kw::Box<int>(in.x0, in.y0, x0, in.y1), mix(mark(active), back, 0.5));
-  p.fillRect(Kw::Box<int>(x0, in.y0, x0 + k, in.y1), palette_.get(Palette::Light));
+  p.fillRect(Kw::Box<int>(x0, in.y0, x0 + k, in.y1), knob());
 }
 
 void MarkLook::focusMark(Painter& p, const Kw::Box<int>& box) const {

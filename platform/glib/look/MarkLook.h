@@ -3,8 +3,10 @@
 // top-left ring and a lit bottom-right one) holding the tick glyph, or a character in its
 // place, or the horizontal bar of the indeterminate state. A switch is a flat track whose knob
 // sits at the left when clear, at the right on a lit track when ticked and in the middle when
-// indeterminate. The well lightens under the pointer; inactive, it and its outline fade halfway
-// into what the box stands on, and the marks take the disabled colour.
+// indeterminate; the knob over a clear track takes whichever bevel colour (light or shadow)
+// stands out more from the well, so it shows on dark and on pale wells alike. The well lightens
+// under the pointer; inactive, it and its outline fade halfway into what the box stands on, and the
+// marks take the disabled colour.
 #include "platform/glob/Palette.h"
 #include "platform/kw/Box.h"
 
@@ -20,6 +22,8 @@ class MarkLook {
   Colour label(const Colour& text, bool active) const;
   // Ticks, bars and lit tracks.
   Colour mark(bool active) const;
+  // The knob over a clear track.
+  Colour knob() const;
 
   // The empty well or track in `box`; `back` is the colour the box stands on.
   void well(Painter& p, const Kw::Box<int>& box, const Colour& back, bool hover, bool active,
