@@ -36,11 +36,11 @@ Palette Palette::light() {
   p.colours_[HighlightedText] = Colour::fromHex(0xFFFFFF);
   p.colours_[Light] = Colour::fromHex(0xFFFFFF);
   p.colours_[Shadow] = Colour::fromHex(0x8F96A0);
-  p.colours_[Disabled] = Colour::fromHex(0x7F858E);
+  p.colours_[Disabled] = Colour::fromHex(0x70767F);
   p.colours_[Caret] = Colour::fromHex(0xB5470B);
   p.colours_[Focus] = Colour::fromHex(0x1F6FD1);
   p.colours_[Border] = Colour::fromHex(0x737B86);
-  p.colours_[Ghost] = Colour::fromHex(0x98A0AA);
+  p.colours_[Ghost] = Colour::fromHex(0x878E98);
   p.shadeStep_ = 0.05;
   return p;
 }
