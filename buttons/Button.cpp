@@ -10,6 +10,7 @@
 #include "platform/glib/Image.h"
 #include "platform/glib/Painter.h"
 #include "platform/glib/UiScale.h"
+#include "platform/glib/look/ButtonLook.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/misc/Diagnostics.h"
@@ -457,7 +458,7 @@ const Colour& Button::get_forecol() const {
 
 Colour Button::get_backcol() const {
   const Colour& c = state == kButtonDown ? downBackCol : upBackCol;
-  if (isActive() && mouseInside && brightening != 0) return scale(c, brightenFactor_);
+  if (isActive() && mouseInside && brightening != 0) return Glib::ButtonLook::hovered(c);
   return c;
 }
 
@@ -492,11 +493,7 @@ void Button::setCol(const Colour& colour, bool redraw) {
   if (redraw) update();
 }
 
-// --- Drawing ---
-//
-// The face is a gentle vertical sheen in the state's colour (darker and reversed while down),
-// framed by a one-pixel outline and a bevel that is raised when up and sunken when down. An
-// inactive button's face sinks toward the base colour and its label takes the disabled colour.
+// --- Drawing: the state read here, the look in Glib::ButtonLook ---
 
 namespace {
 
@@ -528,19 +525,18 @@ const WString& Button::shownLabel() const {
 Kw::Box<int> Button::symbolBox() const {
   const Kw::Box<int> c = contentBox();
   const int side = std::min(c.width(), c.height());
-  Kw::Box<int> box = Kw::Box<int>::fromSize(c.x0 + (c.width() - side) / 2,
-                                            c.y0 + (c.height() - side) / 2, side, side);
-  if (state == kButtonDown && style != kButtonStyleFlat) box = box.translated(1, -1);
-  return box;
+  return Glib::ButtonLook::pressed(
+      Kw::Box<int>::fromSize(c.x0 + (c.width() - side) / 2, c.y0 + (c.height() - side) / 2, side,
+                             side),
+      state == kButtonDown, style == kButtonStyleFlat);
 }
 
 Colour Button::faceColour() const {
-  const Colour back = get_backcol();
-  return isActive() ? back : mix(back, getPalette().get(Palette::Base), 0.35);
+  return Glib::ButtonLook(getPalette()).face(get_backcol(), isActive());
 }
 
 Colour Button::labelColour() const {
-  return isActive() ? get_forecol() : getPalette().get(Palette::Disabled);
+  return Glib::ButtonLook(getPalette()).label(get_forecol(), isActive());
 }
 
 void Button::draw() {
@@ -553,38 +549,19 @@ void Button::draw() {
 void Button::drawBackground() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  const Colour face = faceColour();
-  if (style == kButtonStyleFlat) {
-    p.fillRect(p.bounds(), face);
-  } else if (state == kButtonDown) {
-    p.verticalGradient(p.bounds(), scale(face, 0.92), scale(face, 0.80));
-  } else {
-    p.verticalGradient(p.bounds(), scale(face, 0.90), scale(face, 1.08));
-  }
+  Glib::ButtonLook(getPalette())
+      .background(p, faceColour(), state == kButtonDown, style == kButtonStyleFlat);
 }
 
 void Button::drawEdge() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  const Palette& pal = getPalette();
-  const Kw::Box<int> b = p.bounds();
-  p.outlineRect(b, edgeColour());
-  if (style != kButtonStyleFlat && bevelWidth > 1) {
-    const Colour face = faceColour();
-    const double contrast = isActive() ? 1.0 : 0.5;
-    const Colour light = mix(face, pal.get(Palette::Light), contrast);
-    const Colour shadow = mix(face, pal.get(Palette::Shadow), contrast);
-    const Kw::Box<int> inner(b.x0 + 1, b.y0 + 1, b.x1 - 1, b.y1 - 1);
-    p.depthBox(inner, state == kButtonDown ? Glib::Bevel::Sunken : Glib::Bevel::Raised,
-               bevelWidth - 1, light, shadow);
-  }
+  const Glib::ButtonLook look(getPalette());
+  look.edge(p, edgeColour(), faceColour(), state == kButtonDown, style == kButtonStyleFlat,
+            isActive(), bevelWidth);
   const Kw::Box<int> content = contentBox();
-  if (latching == 2 && state == kButtonDown) {
-    // The lamp of a latched option button.
-    p.fillRect(Kw::Box<int>(content.x0 + 1, content.y0, content.x1 - 1, content.y0 + 2),
-               pal.get(Palette::Highlight));
-  }
-  if (hasKeyboardFocus()) p.focusRect(content, pal.get(Palette::Focus));
+  if (latching == 2 && state == kButtonDown) look.latchLamp(p, content);
+  if (hasKeyboardFocus()) look.focusMark(p, content);
 }
 
 void Button::drawText() {
@@ -593,8 +570,8 @@ void Button::drawText() {
   const int w = width(), h = height();
   // Labels may use the bevel's height (small buttons) but keep clear of its sides.
   const int side = std::min(w / 2, (style == kButtonStyleFlat ? 1 : bevelWidth) + 2);
-  Kw::Box<int> box(side, 1, w - side, h - 1);
-  if (state == kButtonDown && style != kButtonStyleFlat) box = box.translated(1, -1);
+  Kw::Box<int> box = Glib::ButtonLook::pressed(Kw::Box<int>(side, 1, w - side, h - 1),
+                                               state == kButtonDown, style == kButtonStyleFlat);
   const WString text = displayText(shownLabel());
 
   const String& icon = state == kButtonDown && !downIcon.empty() ? downIcon : upIcon;
@@ -607,36 +584,11 @@ void Button::drawText() {
 }
 
 int Button::drawIcon(Glib::Painter& p, const Glib::Image& img, bool alone) {
-  // A picture larger than the room inside the bevel is shrunk to fit, keeping its shape.
-  const Kw::Box<int> room = contentBox();
-  const int iw = img.width(), ih = img.height();
-  if (iw <= 0 || ih <= 0 || room.empty()) return room.x0;
-  const double fit = std::min(
-      {1.0, static_cast<double>(room.width()) / iw, static_cast<double>(room.height()) / ih});
-  const int dw = std::max(1, static_cast<int>(std::lround(iw * fit)));
-  const int dh = std::max(1, static_cast<int>(std::lround(ih * fit)));
-  const int shift = state == kButtonDown && style != kButtonStyleFlat ? 1 : 0;
-  // Alone, the picture is centred on the button; with a label it leads the label.
-  const int x = (alone ? (width() - dw) / 2 : room.x0) + shift;
-  const int y = (height() - dh) / 2 - shift;
-  const double opacity = isActive() ? 1.0 : 0.45;
-  if (fit >= 1.0) {
-    p.image(img, XY<int>(x, y), opacity);
-  } else if (cairo_t* cr = p.cairo()) {
-    cairo_save(cr);
-    cairo_rectangle(cr, x, p.cairoY(y + dh), dw, dh);
-    cairo_clip(cr);
-    cairo_translate(cr, x, p.cairoY(y + dh));
-    cairo_scale(cr, fit, fit);
-    cairo_set_source_surface(cr, img.surface(), 0, 0);
-    cairo_pattern_set_filter(cairo_get_source(cr), CAIRO_FILTER_GOOD);
-    cairo_paint_with_alpha(cr, opacity);
-    cairo_restore(cr);
-  }
-  return x + dw;
+  return Glib::ButtonLook::picture(
+      p, img, contentBox(), p.bounds(), alone,
+      Glib::ButtonLook::pressShift(state == kButtonDown, style == kButtonStyleFlat), isActive());
 }
 
 Colour Button::edgeColour() {
-  const Palette& pal = getPalette();
-  return hasKeyboardFocus() ? pal.get(Palette::Focus) : pal.get(Palette::Border);
+  return Glib::ButtonLook(getPalette()).edge(hasKeyboardFocus());
 }

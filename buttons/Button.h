@@ -44,6 +44,7 @@
 #include "foundation/rect.h"
 #include "platform/glib/TextAlignment.h"
 #include "platform/glib/TextStyles.h"
+#include "platform/glib/look/ButtonLook.h"
 
 enum button_state : int { kButtonUp = 0, kButtonDown = 1 };
 
@@ -81,7 +82,7 @@ class Painter;
 
 class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
  public:
-  static constexpr double brightenFactor_ = 1.2;
+  static constexpr double brightenFactor_ = Glib::ButtonLook::kHoverBrighten;
   // The thinner bevel of the small buttons of a panel's title strip.
   static constexpr int kTitleBevelWidth = 2;
 

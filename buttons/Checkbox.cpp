@@ -6,7 +6,8 @@
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
-#include "platform/glib/Symbols.h"
+#include "platform/glib/look/MarkLook.h"
+#include "platform/glib/look/PanelLook.h"
 #include "platform/glob/GlobHandle.h"
 
 namespace {
@@ -312,8 +313,7 @@ void Checkbox::setTickCharacter(char c) {
 }
 
 Colour Checkbox::textColourFor(bool enabled) const {
-  const Palette p(ticked ? textColourWhenTicked : textColour, getPalette().windowShade(3));
-  return enabled ? p.get(Palette::WindowText) : p.get(Palette::Disabled);
+  return Glib::MarkLook(getPalette()).label(ticked ? textColourWhenTicked : textColour, enabled);
 }
 
 Colour Checkbox::getTextColour() {
@@ -354,78 +354,41 @@ void Checkbox::draw() {
 void Checkbox::drawBackground() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  p.fillRect(p.bounds(), getcol());
+  Glib::PanelLook(getPalette()).face(p, getcol());
 }
 
 void Checkbox::paintIndicatorWell() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  const Palette& pal = getPalette();
-  const Kw::Box<int> box = indicatorBox();
-  const bool hover = mouseInside && isActive() && brighten;
-  Colour well = pal.get(Palette::Base);
-  if (hover) well = scale(mix(well, pal.get(Palette::Light), 0.25), 1.1);
-  if (!isActive()) well = mix(well, getcol(), 0.5);
-  const Colour edge =
-      isActive() ? pal.get(Palette::Border) : mix(pal.get(Palette::Border), getcol(), 0.5);
-  if (appearance == FlatToggle) {
-    p.fillRect(box, well);
-    p.outlineRect(box, edge);
-    return;
-  }
-  // A sunken well: dark outline, a shadowed top-left inner ring, a light bottom-right one.
-  p.fillRect(box, well);
-  p.outlineRect(box, edge);
-  const Kw::Box<int> in = inset(box, 1, 1);
-  p.depthBox(in, Glib::Bevel::Sunken, 1, mix(well, pal.get(Palette::Light), 0.5),
-             mix(well, pal.get(Palette::Shadow), 0.8));
+  Glib::MarkLook(getPalette())
+      .well(p, indicatorBox(), getcol(), mouseInside && isActive() && brighten, isActive(),
+            appearance == FlatToggle);
 }
 
 void Checkbox::drawTickBox() {
   paintIndicatorWell();
   if (appearance != FlatToggle || ticked) return;
-  // The clear switch: its knob at the left end.
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  const Kw::Box<int> box = inset(indicatorBox(), 2, 2);
-  const Colour knob =
-      isActive() ? getPalette().get(Palette::Light) : getPalette().get(Palette::Disabled);
-  p.fillRect(Kw::Box<int>(box.x0, box.y0, box.x0 + box.height(), box.y1), knob);
+  Glib::MarkLook(getPalette()).switchOff(p, indicatorBox(), isActive());
 }
 
 void Checkbox::drawTick(bool full) {
   paintIndicatorWell();
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  const Palette& pal = getPalette();
-  const Colour mark = isActive() ? pal.get(Palette::Highlight) : pal.get(Palette::Disabled);
+  const Glib::MarkLook look(getPalette());
   const Kw::Box<int> box = indicatorBox();
   if (appearance == FlatToggle) {
-    const Kw::Box<int> in = inset(box, 2, 2);
-    const int k = in.height();
     if (full) {
-      p.fillRect(in, mark);
-      p.fillRect(Kw::Box<int>(in.x1 - k, in.y0, in.x1, in.y1), pal.get(Palette::HighlightedText));
+      look.switchOn(p, box, isActive());
     } else {
-      const int x0 = in.x0 + (in.width() - k) / 2;
-      p.fillRect(Kw::Box<int>(in.x0, in.y0, x0, in.y1), mix(mark, getcol(), 0.5));
-      p.fillRect(Kw::Box<int>(x0, in.y0, x0 + k, in.y1), pal.get(Palette::Light));
+      look.switchMixed(p, box, getcol(), isActive());
     }
-    return;
-  }
-  if (!full) {
-    const int barHeight = std::max(2, box.height() / 5);
-    const int y0 = box.y0 + (box.height() - barHeight) / 2;
-    p.fillRect(Kw::Box<int>(box.x0 + 3, y0, box.x1 - 3, y0 + barHeight), mark);
-    return;
-  }
-  const Kw::Box<int> glyphBox = inset(box, 1, 1);
-  if (tickCharacter == 0) {
-    p.symbol(Glib::kSymbolTick, glyphBox, mark);
+  } else if (full) {
+    look.tick(p, box, tickCharacter, isActive());
   } else {
-    const WString ch(1, static_cast<wchar_t>(static_cast<unsigned char>(tickCharacter)));
-    p.text(ch, glyphBox, *Glib::fonts().standard(), mark, TextAlignment::Centred,
-           Glib::TextStyles::Plain);
+    look.mixedBar(p, box, isActive());
   }
 }
 
@@ -453,6 +416,6 @@ void Checkbox::drawLabel() {
                                   ? inset(ind, -2, -2)
                                   : Kw::Box<int>(std::min(ind.x0, text.x0) - 2, ind.y0 - 2,
                                                  std::max(ind.x1, text.x1) + 1, ind.y1 + 2);
-    p.focusRect(mark, getPalette().get(Palette::Focus));
+    Glib::MarkLook(getPalette()).focusMark(p, mark);
   }
 }

@@ -15,5 +15,5 @@ void PootButton::drawText() {
   }
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  Glib::drawSymbol(p, Glib::kSymbolCross, symbolBox(), labelColour());
+  Glib::ButtonLook::glyph(p, Glib::kSymbolCross, symbolBox(), labelColour());
 }

@@ -4,6 +4,7 @@
 
 #include "panels/PanelGeometry.h"
 #include "platform/glib/Painter.h"
+#include "platform/glib/look/PanelLook.h"
 #include "platform/glob/GlobHandle.h"
 
 RadioSet::RadioSet(const std::vector<WString>& labels, const GlobCreationInfo& info)
@@ -77,27 +78,10 @@ void RadioSet::reshape() {
 void RadioSet::draw() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  const Palette& pal = getPalette();
-  const Colour face = pal.get(Palette::Window);
-  p.fillRect(p.bounds(), face);
-  const int b = PanelGeometry::borderSize(border_);
-  if (b == 0) return;
-  const Colour light = pal.get(Palette::Light), shadow = pal.get(Palette::Shadow);
-  switch (border_) {
-    case UifBorderRaised:
-      p.depthBox(p.bounds(), Glib::Bevel::Raised, b, light, shadow);
-      break;
-    case UifBorderSunken:
-      p.depthBox(p.bounds(), Glib::Bevel::Sunken, b, light, shadow);
-      break;
-    default:
-      p.outlineRect(p.bounds(), pal.get(Palette::Border));
-      p.depthBox(Kw::Box<int>(1, 1, width() - 1, height() - 1), Glib::Bevel::Raised, 2, light,
-                 shadow);
-      p.depthBox(Kw::Box<int>(b - 2, b - 2, width() - b + 2, height() - b + 2), Glib::Bevel::Sunken,
-                 2, light, shadow);
-      break;
-  }
+  const Glib::PanelLook look(getPalette());
+  look.groupFace(p);
+  look.groupFrame(p, static_cast<Glib::PanelLook::Frame>(border_),
+                  PanelGeometry::borderSize(border_));
 }
 
 void RadioSet::setActive(bool active, bool redraw) {

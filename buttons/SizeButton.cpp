@@ -47,5 +47,5 @@ void SizeButton::drawText() {
   }
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  Glib::drawSymbol(p, static_cast<int>(label[0]), symbolBox(), labelColour());
+  Glib::ButtonLook::glyph(p, static_cast<int>(label[0]), symbolBox(), labelColour());
 }

@@ -11,11 +11,16 @@
 namespace {
 
 // The gallery's own icons (drawn by tools/gallery-icons.cpp), found by name like any
-// application's.
-void addGalleryIcons() {
+// application's. A pale palette finds the dark-ink set first. The search path is the
+// process's: the first palette to build the page decides.
+void addGalleryIcons(const Palette& palette) {
+  const Colour& w = palette.get(Palette::Window);
+  const bool pale = 0.2126 * w.r + 0.7152 * w.g + 0.0722 * w.b > 0.5;
 #ifdef GLOBKIT_GALLERY_ICONS
+  if (pale) imageSearchPath().addDirectory(GLOBKIT_GALLERY_ICONS "/light");
   imageSearchPath().addDirectory(GLOBKIT_GALLERY_ICONS);
 #endif
+  if (pale) imageSearchPath().addDirectory("gallery/icons/light");
   imageSearchPath().addDirectory("gallery/icons");
 }
 
@@ -123,7 +128,7 @@ void buildTitleStrip(GalleryPage& page, int top) {
 }  // namespace
 
 void buildButtonsPage(GalleryPage& page) {
-  addGalleryIcons();
+  addGalleryIcons(page.getPalette());
   addSizeButtonStrings();
   const int top = GalleryPage::kContentTop;
   buildPushButtons(page, top);

@@ -53,7 +53,8 @@ void buildTriState(GalleryPage& page, ChecksPageModel& model, int top) {
   release->setTickCharacter('x');
   Checkbox* bold = box(page, x + kGap + 150, y + 3 * kRowStep + 8, 140, L"Bold ticked", true);
   bold->setBoldWhenTicked(true);
-  bold->setTextColourWhenTicked(Colour::fromHex(0xF5C542));
+  // The warm caret colour of the palette, so that it reads on dark and pale panels.
+  bold->setTextColourWhenTicked(page.getPalette().get(Palette::Caret));
   bold->setMsgPrefix("bold ", true);
   box(page, x + kGap, y + 4 * kRowStep + 8, 200, L"Unavailable", true)->setActive(false, true);
 }

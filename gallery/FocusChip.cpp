@@ -2,6 +2,7 @@
 
 #include "gallery/GalleryLook.h"
 #include "platform/glib/Painter.h"
+#include "platform/glib/look/FaceLook.h"
 #include "platform/kw/String.h"
 
 FocusChip::FocusChip(const GlobCreationInfo& info, const String& label)
@@ -30,8 +31,5 @@ void FocusChip::draw() {
   look.card(p, p.bounds(), focused ? look.hover() : look.role(Palette::Button));
   look.label(p, label_, p.bounds(), GalleryLook::Font::Body,
              focused ? look.strongText() : look.text());
-  if (focused) {
-    const Kw::Box<int> b = p.bounds();
-    p.outlineRect(Kw::Box<int>(b.x0 + 2, b.y0 + 2, b.x1 - 2, b.y1 - 2), look.accent(), 2);
-  }
+  if (focused) Glib::FaceLook::focusRing(p, p.bounds(), look.accent());
 }

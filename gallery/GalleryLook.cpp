@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "platform/glib/FontCache.h"
+#include "platform/glib/look/FaceLook.h"
 
 const Glib::iFont& GalleryLook::font(Font f) {
   using Glib::FontDesc;
@@ -46,22 +47,17 @@ void GalleryLook::label(Glib::Painter& p, const String& utf8, const Kw::Box<int>
 }
 
 void GalleryLook::card(Glib::Painter& p, const Kw::Box<int>& box, const Colour& face) const {
-  p.depthBox(box, Glib::Bevel::Raised, 1, mix(face, role(Palette::Light), 0.45),
-             role(Palette::Shadow), face);
+  Glib::FaceLook(palette_).raised(p, box, face);
 }
 
 void GalleryLook::well(Glib::Painter& p, const Kw::Box<int>& box, const Colour& face) const {
-  p.depthBox(box, Glib::Bevel::Sunken, 1, mix(face, role(Palette::Light), 0.45),
-             role(Palette::Shadow), face);
+  Glib::FaceLook(palette_).sunken(p, box, face);
 }
 
 void GalleryLook::lamp(Glib::Painter& p, XY<int> centre, const Colour& c) const {
-  const Kw::Box<int> box(centre.x - 4, centre.y - 4, centre.x + 4, centre.y + 4);
-  p.depthBox(box, Glib::Bevel::Sunken, 1, mix(c, role(Palette::Light), 0.5), role(Palette::Shadow),
-             c);
+  Glib::FaceLook(palette_).lamp(p, centre, c);
 }
 
 void GalleryLook::strip(Glib::Painter& p, const Kw::Box<int>& box) const {
-  p.verticalGradient(box, palette_.windowShade(2), role(Palette::Window));
-  p.fillRect(Kw::Box<int>(box.x0, box.y0, box.x1, box.y0 + 1), line());
+  Glib::FaceLook(palette_).headerStrip(p, box);
 }

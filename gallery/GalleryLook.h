@@ -1,8 +1,9 @@
 #pragma once
 // The gallery's own chrome (header, page selector, page headings and cards, message log, the
 // foundation page's tiles and key probe) in the library's look: colours by palette role and a
-// few shades around the window colour, bevels and text through Glib::Painter, fonts from the
-// font cache. Made from the palette of the Glob that draws.
+// few shades around the window colour, faces and bevels from the look layer (Glib::FaceLook),
+// text through Glib::Painter, fonts from the font cache. Made from the palette of the Glob that
+// draws.
 #include "platform/glib/Painter.h"
 #include "platform/glib/iFont.h"
 #include "platform/glob/Palette.h"

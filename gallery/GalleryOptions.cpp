@@ -9,7 +9,7 @@ constexpr int kMaxSide = 8192;
 
 const char* GalleryOptions::usage() {
   return "usage: globkit-gallery [--headless] [--screenshot DIR] [--log FILE] [--dump-tree]\n"
-         "                       [--size WxH]\n";
+         "                       [--size WxH] [--palette dark|light]\n";
 }
 
 bool GalleryOptions::parse(int argc, char** argv, String& error) {
@@ -22,7 +22,7 @@ bool GalleryOptions::parse(int argc, char** argv, String& error) {
       dumpTree = true;
     } else if (arg == "--help" || arg == "-h") {
       help = true;
-    } else if (arg == "--screenshot" || arg == "--log" || arg == "--size") {
+    } else if (arg == "--screenshot" || arg == "--log" || arg == "--size" || arg == "--palette") {
       if (!hasValue) {
         error = arg + " needs a value";
         return false;
@@ -32,6 +32,15 @@ bool GalleryOptions::parse(int argc, char** argv, String& error) {
         screenshotDir = value;
       } else if (arg == "--log") {
         logFile = value;
+      } else if (arg == "--palette") {
+        if (value == "dark") {
+          palette = Palette::dark();
+        } else if (value == "light") {
+          palette = Palette::light();
+        } else {
+          error = "--palette wants dark or light, not '" + value + "'";
+          return false;
+        }
       } else {
         int w = 0, h = 0;
         char tail = 0;

@@ -6,6 +6,8 @@
 //   --log FILE          the message log also written to FILE, one line per message
 //   --dump-tree         the Glob tree as JSON on stdout once the first frame is shown
 //   --size WxH          the window's size in window units (default 1280x820)
+//   --palette NAME      the look: dark (the default) or light
+#include "platform/glob/Palette.h"
 #include "platform/kw/String.h"
 
 struct GalleryOptions {
@@ -16,6 +18,7 @@ struct GalleryOptions {
   String logFile;
   int width = 1280;
   int height = 820;
+  Palette palette = Palette::dark();
 
   // Reads the arguments; false with `error` set when they make no sense.
   bool parse(int argc, char** argv, String& error);

@@ -5,6 +5,7 @@
 #include <cstdio>
 
 #include "gallery/GalleryLook.h"
+#include "platform/glib/look/MarkLook.h"
 
 KeyProbe::KeyProbe(const GlobCreationInfo& info) : Glob(info) {
   set_name("Key probe");
@@ -101,7 +102,7 @@ void KeyProbe::draw() {
   // A text field: a sunken well of the entry colour, marked while it has the keyboard.
   look.well(p, b, look.role(Palette::Base));
   if (focused) {
-    p.focusRect(Kw::Box<int>(b.x0 + 3, b.y0 + 3, b.x1 - 3, b.y1 - 3), look.role(Palette::Focus));
+    Glib::MarkLook(getPalette()).focusMark(p, Kw::Box<int>(b.x0 + 3, b.y0 + 3, b.x1 - 3, b.y1 - 3));
   }
   const Kw::Box<int> inner(b.x0 + 12, b.y0, b.x1 - 12, b.y1);
   if (shown_.empty()) {

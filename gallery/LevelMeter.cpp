@@ -4,6 +4,7 @@
 
 #include "gallery/GalleryLook.h"
 #include "platform/glib/Painter.h"
+#include "platform/glib/look/FaceLook.h"
 
 LevelMeter::LevelMeter(const GlobCreationInfo& info) : Glob(info) {
   setDefaultCursor(kCursorHand);
@@ -38,11 +39,6 @@ void LevelMeter::setNewWidgetValue(int& value) {
 void LevelMeter::draw() {
   Glib::Painter p(*canvas());
   const GalleryLook look(getPalette());
-  look.well(p, p.bounds(), look.role(Palette::Base));
-  const int segment = std::max(1, (width() - 4) / kLevels);
-  for (int i = 0; i < kLevels; ++i) {
-    const Kw::Box<int> seg(2 + i * segment + 1, 3, 2 + (i + 1) * segment - 1, height() - 3);
-    const Colour on = mix(look.accent(), GalleryLook::kReady, double(i) / kLevels);
-    p.fillRect(seg, i < level_ ? on : look.hover());
-  }
+  Glib::FaceLook(getPalette())
+      .meter(p, p.bounds(), kLevels, level_, look.accent(), GalleryLook::kReady);
 }

@@ -8,11 +8,11 @@
 #include <memory>
 
 #include "gallery/GalleryApp.h"
-#include "text/PanelTitleTextBox.h"
 #include "gallery/GalleryOptions.h"
 #include "gallery/TreeDump.h"
 #include "platform/backend/HeadlessBackend.h"
 #include "platform/backend/WindowBackend.h"
+#include "text/PanelTitleTextBox.h"
 
 namespace {
 
@@ -82,6 +82,8 @@ int main(int argc, char** argv) {
   if (!window) headless = std::make_unique<HeadlessBackend>(options.width, options.height);
   Backend& screen = window ? static_cast<Backend&>(*window) : *headless;
   const double scale = window ? window->pixelScale() : 1.0;
+  // Everything made on the screen from here on takes its palette.
+  screen.root().setPalette(options.palette);
 
   auto app = std::make_unique<GalleryApp>(screen.root(), log);
   screen.render();

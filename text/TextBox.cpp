@@ -6,6 +6,7 @@
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
+#include "platform/glib/look/TextFieldLook.h"
 #include "platform/glob/RuntimeClock.h"
 #include "platform/kw/CharClassifier.h"
 #include "platform/misc/WindowsClipboard.h"
@@ -473,16 +474,14 @@ void TextBox::resize(double width, double height) {
 void TextBox::draw() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  const Palette& pal = getPalette();
-  const Kw::Box<int> box = p.bounds();
-  const Colour well = pal.get(isActive() ? Palette::Base : Palette::Window);
-  p.depthBox(box, Glib::Bevel::Sunken, 1, pal.get(Palette::Light), pal.get(Palette::Shadow), well);
+  const Glib::TextFieldLook look(getPalette());
+  look.well(p, p.bounds(), isActive());
   drawText(p);
-  if (focused_) p.outlineRect(box, pal.get(Palette::Focus));
+  if (focused_) look.focusOutline(p, p.bounds());
 }
 
 void TextBox::drawText(Glib::Painter& p) {
-  const Palette& pal = getPalette();
+  const Glib::TextFieldLook look(getPalette());
   const int w = static_cast<int>(width());
   const int h = static_cast<int>(height());
   const Kw::Box<int> stretch(leftMargin_, 0, w - rightMargin_, h);
@@ -499,7 +498,7 @@ void TextBox::drawText(Glib::Painter& p) {
         if (alignment_ == TextAlignment::Right) x = w - rightMargin_ - gw;
         if (alignment_ == TextAlignment::Centred) x = (w - gw) / 2;
       }
-      p.textAt(ghost, XY<int>(x, (h - font->height()) / 2), *font, pal.get(Palette::Ghost));
+      p.textAt(ghost, XY<int>(x, (h - font->height()) / 2), *font, look.ghost());
     }
     p.popClip();
     return;
@@ -523,12 +522,12 @@ void TextBox::drawText(Glib::Painter& p) {
                     .intersection(stretch);
   }
   if (!selection.empty()) {
-    p.fillRect(selection, pal.get(focused_ ? Palette::Highlight : Palette::Shadow));
+    look.selection(p, selection, focused_);
   }
   drawPieces(getTextColour());
   if (!selection.empty()) {
     p.pushClip(selection);
-    drawPieces(pal.get(Palette::HighlightedText));
+    drawPieces(look.selectedText());
     p.popClip();
   }
   p.popClip();

@@ -1,6 +1,7 @@
 #include "text/TextBoxBase.h"
 
 #include "platform/glib/FontCache.h"
+#include "platform/glib/look/TextFieldLook.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/glob/RuntimeClock.h"
 #include "platform/kw/CharClassifier.h"
@@ -103,7 +104,7 @@ Colour TextBoxBase::getCaretColour() const {
 }
 
 Colour TextBoxBase::getTextColour() const {
-  return getPalette().get(isActive() ? Palette::Text : Palette::Disabled);
+  return Glib::TextFieldLook(getPalette()).text(isActive());
 }
 
 void TextBoxBase::clearChanged() {

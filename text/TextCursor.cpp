@@ -4,6 +4,7 @@
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
+#include "platform/glib/look/TextFieldLook.h"
 #include "platform/glob/RuntimeClock.h"
 
 namespace {
@@ -25,9 +26,9 @@ TextCursor::TextCursor(const Glib::FontDesc& font, Canvas* canvas)
 
 TextCursor::TextCursor(Glib::FontPtr font, Canvas* canvas)
     : Glob(caretInfo(font, canvas)), font_(std::move(font)) {
-  const Palette& p = getPalette();
-  caretColour_ = p.get(Palette::Caret);
-  inverseColour_ = p.get(Palette::Base);
+  const Glib::TextFieldLook look(getPalette());
+  caretColour_ = look.caret();
+  inverseColour_ = look.caretInside();
 }
 
 void TextCursor::setFont(const Glib::FontDesc& font) {
@@ -128,8 +129,6 @@ int TextCursor::react(Event* e) {
 void TextCursor::draw() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
-  p.fillRect(p.bounds(), caretColour_);
-  if (style_ == StyleBlock && current_ != 0 && current_ != L' ') {
-    p.textAt(WString(1, current_), XY<int>(0, 0), *font_, inverseColour_);
-  }
+  Glib::TextFieldLook::caretBlock(p, caretColour_, style_ == StyleBlock, current_, *font_,
+                                  inverseColour_);
 }

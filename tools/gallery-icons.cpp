@@ -2,8 +2,10 @@
 //
 //   g++ -std=c++20 tools/gallery-icons.cpp $(pkg-config --cflags --libs cairo) -o /tmp/icons
 //   /tmp/icons gallery/icons
+//   /tmp/icons gallery/icons/light dark-ink
 //
-// Light strokes on a transparent ground, to sit on the dark-grey title strip.
+// Light strokes on a transparent ground, to sit on the dark-grey title strip; with "dark-ink",
+// dark strokes for the pale title strip of the light palette.
 #include <cairo.h>
 
 #include <cmath>
@@ -13,10 +15,12 @@
 namespace {
 
 constexpr int kSize = 16;
-constexpr double kInk[3] = {0.86, 0.87, 0.89};
+constexpr double kLightInk[3] = {0.86, 0.87, 0.89};
+constexpr double kDarkInk[3] = {0.20, 0.22, 0.25};
+const double* gInk = kLightInk;
 
 void ink(cairo_t* cr, double alpha = 1.0) {
-  cairo_set_source_rgba(cr, kInk[0], kInk[1], kInk[2], alpha);
+  cairo_set_source_rgba(cr, gInk[0], gInk[1], gInk[2], alpha);
 }
 
 // A cog: eight teeth round a ring with a hole.
@@ -84,6 +88,7 @@ bool write(const std::string& dir, const char* name, void (*paint)(cairo_t*)) {
 
 int main(int argc, char** argv) {
   const std::string dir = argc > 1 ? argv[1] : ".";
+  if (argc > 2 && std::string(argv[2]) == "dark-ink") gInk = kDarkInk;
   bool ok = write(dir, "settings.png", drawSettings);
   ok = write(dir, "pin.png", [](cairo_t* cr) { drawPin(cr, false); }) && ok;
   ok = write(dir, "pinned.png", [](cairo_t* cr) { drawPin(cr, true); }) && ok;

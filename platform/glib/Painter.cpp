@@ -237,6 +237,22 @@ void Painter::image(const Image& img, XY<int> at, double opacity) {
   cairo_restore(cr);
 }
 
+void Painter::scaledImage(const Image& img, const Kw::Box<int>& box, double factor,
+                          double opacity) {
+  if (!session_ || !img.surface() || box.empty() || !(factor > 0)) return;
+  cairo_t* cr = cairo();
+  const double top = cairoY(box.y1);
+  cairo_save(cr);
+  cairo_rectangle(cr, box.x0, top, box.width(), box.height());
+  cairo_clip(cr);
+  cairo_translate(cr, box.x0, top);
+  cairo_scale(cr, factor, factor);
+  cairo_set_source_surface(cr, img.surface(), 0, 0);
+  cairo_pattern_set_filter(cairo_get_source(cr), CAIRO_FILTER_GOOD);
+  cairo_paint_with_alpha(cr, std::clamp(opacity, 0.0, 1.0));
+  cairo_restore(cr);
+}
+
 void Painter::compositeText(const TextLayout& layout, int left, int top, const Colour& c) {
   if (!(c.a > 0)) return;
   if (!layout.hasMask()) {

@@ -62,6 +62,9 @@ class Painter {
   // --- Images ---
   // Draws the image with its bottom-left corner at `at`, blending its transparency.
   void image(const Image& img, XY<int> at, double opacity = 1.0);
+  // Draws the image magnified by `factor` (smoothly filtered), its top-left corner at the
+  // top-left corner of `box` and clipped to `box`, with the given opacity.
+  void scaledImage(const Image& img, const Kw::Box<int>& box, double factor, double opacity);
 
   // --- Text ---
   // One line of text inside `box`: aligned horizontally, centred vertically, clipped to the

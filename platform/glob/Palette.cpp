@@ -20,6 +20,31 @@ Palette::Palette() {
   colours_[Ghost] = Colour::fromHex(0x7C8088);
 }
 
+Palette Palette::dark() {
+  return Palette();
+}
+
+Palette Palette::light() {
+  Palette p;
+  p.colours_[Window] = Colour::fromHex(0xE9ECF0);
+  p.colours_[WindowText] = Colour::fromHex(0x1D2127);
+  p.colours_[Button] = Colour::fromHex(0xD5DAE1);
+  p.colours_[ButtonText] = Colour::fromHex(0x14171C);
+  p.colours_[Base] = Colour::fromHex(0xFFFFFF);
+  p.colours_[Text] = Colour::fromHex(0x14171C);
+  p.colours_[Highlight] = Colour::fromHex(0x2A72C4);
+  p.colours_[HighlightedText] = Colour::fromHex(0xFFFFFF);
+  p.colours_[Light] = Colour::fromHex(0xFFFFFF);
+  p.colours_[Shadow] = Colour::fromHex(0x8F96A0);
+  p.colours_[Disabled] = Colour::fromHex(0x70767F);
+  p.colours_[Caret] = Colour::fromHex(0xB5470B);
+  p.colours_[Focus] = Colour::fromHex(0x1F6FD1);
+  p.colours_[Border] = Colour::fromHex(0x737B86);
+  p.colours_[Ghost] = Colour::fromHex(0x878E98);
+  p.shadeStep_ = 0.05;
+  return p;
+}
+
 Palette::Palette(const Colour& fore, const Colour& back) : Palette() {
   colours_[WindowText] = fore;
   colours_[ButtonText] = fore;
@@ -30,6 +55,6 @@ Palette::Palette(const Colour& fore, const Colour& back) : Palette() {
 
 Colour Palette::windowShade(int level) const {
   level = std::clamp(level, 0, 6);
-  // Shade 3 is the window colour itself; each step is 12% darker or lighter.
-  return scale(colours_[Window], 1.0 + 0.12 * (level - 3));
+  // Shade 3 is the window colour itself.
+  return scale(colours_[Window], 1.0 + shadeStep_ * (level - 3));
 }

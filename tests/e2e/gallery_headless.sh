@@ -30,6 +30,15 @@ grep -q '"kind": "gallerypage", "name": "Foundation".*"visible": true' "$work/tr
 grep -q '"kind": "gallerypage", "name": "Panels".*"visible": false' "$work/tree.json" ||
   fail "a later page is shown"
 
+env -u DISPLAY -u WAYLAND_DISPLAY "$gallery" --size 900x640 --palette light \
+  --screenshot "$work/light" >"$work/light-paths" 2>"$work/err" ||
+  fail "light screenshots: status $? $(cat "$work/err")"
+[ "$(wc -l <"$work/light-paths")" -eq 8 ] || fail "expected 8 light pages"
+cmp -s "$work/shots/page-buttons.png" "$work/light/page-buttons.png" &&
+  fail "the light palette drew the dark pages"
+"$gallery" --headless --palette sepia >/dev/null 2>&1
+[ $? -eq 2 ] || fail "an unknown palette is not refused"
+
 "$gallery" --size 10x10 >/dev/null 2>&1
 [ $? -eq 2 ] || fail "a bad size is not refused"
 echo "PASS"
