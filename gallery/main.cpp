@@ -8,7 +8,6 @@
 #include <memory>
 
 #include "gallery/GalleryApp.h"
-#include "text/PanelTitleTextBox.h"
 #include "gallery/GalleryOptions.h"
 #include "gallery/TreeDump.h"
 #include "platform/backend/HeadlessBackend.h"
@@ -66,9 +65,6 @@ int main(int argc, char** argv) {
     std::fputs(GalleryOptions::usage(), stdout);
     return 0;
   }
-
-  // Every panel of every page gets an editable title box when it asks for one.
-  PanelTitleTextBox::install();
 
   MessageLog log;
   if (!options.logFile.empty() && !log.attachFile(options.logFile)) return 1;

@@ -17,6 +17,7 @@
 #include "platform/misc/Diagnostics.h"
 #include "platform/misc/UIString.h"
 #include "platform/misc/configb.h"
+#include "text/PanelTitleTextBox.h"
 
 const char* const StandardPanel::doItMsg = "do_it";
 const char* const StandardPanel::titleChangedMsg = "StdPanelTitleChanged";
@@ -30,11 +31,6 @@ constexpr unsigned short kPinHeight = 20;
 constexpr unsigned short kDoItWidth = 80;
 constexpr unsigned short kDoItHeight = 22;
 constexpr unsigned kDoItLabelId = 41;  // how much of the screen the modal shade hides, of 255
-
-PanelTitleBoxFactory& titleBoxFactory() {
-  static PanelTitleBoxFactory factory;
-  return factory;
-}
 
 Canvas* screenCanvas() {
   RootGlob* r = RootGlob::current();
@@ -86,10 +82,9 @@ struct StandardPanel::StandardWidgets {
   GlobHandle<SizeButton> size;
   GlobHandle<PinButton> pin;
   GlobHandle<Button> doIt;
-  GlobHandle<> titleGlob;
-  std::unique_ptr<PanelTitleBox> title;
+  GlobHandle<PanelTitleTextBox> title;
 
-  Glob* titleBoxGlob() const { return title ? titleGlob.get() : nullptr; }
+  Glob* titleBoxGlob() const { return title.get(); }
 };
 
 // --- Construction ---
@@ -132,7 +127,6 @@ void StandardPanel::init() {
 
 StandardPanel::~StandardPanel() {
   while (modalDepth_ > 0) setModal(false);
-  std_->title.reset();
   std::vector<WidgetDetails> list;
   list.swap(widgets_);
   for (WidgetDetails& d : list) {
@@ -168,7 +162,7 @@ void StandardPanel::setBorderStyle(UifTypeOfBorder border) {
 void StandardPanel::setTitle(const WString& title) {
   if (title == title_) return;
   title_ = title;
-  if (std_->titleBoxGlob()) std_->title->setText(title_);
+  if (PanelTitleTextBox* box = std_->title.get()) box->showTitle(title_);
   update();
 }
 
@@ -509,12 +503,8 @@ bool StandardPanel::decrementTab() {
 
 // --- Standard widgets ---
 
-void StandardPanel::setTitleBoxFactory(PanelTitleBoxFactory factory) {
-  titleBoxFactory() = std::move(factory);
-}
-
-PanelTitleBox* StandardPanel::titleBox() const {
-  return std_->titleBoxGlob() ? std_->title.get() : nullptr;
+PanelTitleTextBox* StandardPanel::titleBox() const {
+  return std_->title.get();
 }
 
 Glob* StandardPanel::standardWidget(StandardWidgetFlag flag) const {
@@ -540,7 +530,7 @@ void StandardPanel::addStandardWidgets(int flags) {
   flags &= kStdAllFlags;
   stdFlags_ |= flags;
   createStandardButtons(stdFlags_);
-  createTitleBox(stdFlags_);
+  syncTitleBox();
   recalculateWidgetPositions();
   update();
 }
@@ -584,19 +574,21 @@ void StandardPanel::createStandardButtons(int flags) {
   }
 }
 
-void StandardPanel::createTitleBox(int flags) {
-  if (!(flags & (StdTitleBox | StdEditableTitleBox)) || std_->titleBoxGlob()) return;
-  std_->title.reset();
-  const PanelTitleBoxFactory& factory = titleBoxFactory();
-  if (!factory) return;
-  const bool editable = (flags & StdEditableTitleBox) != 0;
-  std::unique_ptr<PanelTitleBox> box =
-      factory(*this, toDimension(calcMaxTitleWidgetWidth()), kTitleBoxHeight, editable);
-  Glob* g = box ? box->glob() : nullptr;
-  if (!is_good_glob_ptr(g)) return;
-  if (!ownsCanvasOf(g)) g->canvas()->reparent(canvas());
-  std_->titleGlob = g;
-  std_->title = std::move(box);
+void StandardPanel::syncTitleBox() {
+  // One box serves both title flags: editable while 0x40 is set, read-only with 0x20 alone,
+  // gone with neither.
+  const bool wanted = (stdFlags_ & (StdTitleBox | StdEditableTitleBox)) != 0;
+  const bool editable = (stdFlags_ & StdEditableTitleBox) != 0;
+  PanelTitleTextBox* box = std_->title.get();
+  if (!wanted) {
+    if (box) delete box;
+    std_->title.reset();
+  } else if (!box) {
+    std_->title = new PanelTitleTextBox(*this, toDimension(calcMaxTitleWidgetWidth()),
+                                        kTitleBoxHeight, editable);
+  } else if (box->isEditable() != editable) {
+    box->setEditable(editable);
+  }
 }
 
 void StandardPanel::removeStandardWidgets(int flags, bool redraw) {
@@ -612,11 +604,7 @@ void StandardPanel::removeStandardWidgets(int flags, bool redraw) {
   if (flags & StdSizeButton) drop(std_->size);
   if (flags & StdDoItButton) drop(std_->doIt);
   if (flags & StdPinButton) drop(std_->pin);
-  // One box serves both title flags: it goes with the last of them.
-  if (!(stdFlags_ & (StdTitleBox | StdEditableTitleBox))) {
-    std_->title.reset();
-    drop(std_->titleGlob);
-  }
+  syncTitleBox();
   recalculateWidgetPositions();
   if (redraw) update();
 }
@@ -789,7 +777,7 @@ int StandardPanel::reactToMessage(Event* e) {
     return 1;
   }
   if (msg == titleChangedMsg && titleBox()) {
-    setTitle(titleBox()->text());
+    setTitle(titleBox()->getText());
     if (self) handleTitleChange();
     return 1;
   }

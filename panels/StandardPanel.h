@@ -39,6 +39,9 @@
 // - The pin button latches and is given the message "pin", so that it reports "pin on" and
 //   "pin off"; it is kept down while the panel is pinned. The title buttons take the panel's
 //   palette; the do-it button keeps the standard button look.
+// - The title box is a PanelTitleTextBox that the panel makes itself. One box serves both
+//   title flags: editable while 0x40 is set, read-only with 0x20 alone; adding or removing a
+//   flag re-styles the box in place, and it goes with the last of the two.
 // - "StdPanelTitleChanged" and "pin on"/"pin off" are handled as such only while the panel has
 //   a title box or a pin button; otherwise they reach handleMessageEvent like any message.
 #include <memory>
@@ -47,12 +50,12 @@
 #include "foundation/TabOrderManager.h"
 #include "foundation/rect.h"
 #include "panels/PanelGeometry.h"
-#include "panels/PanelTitleBox.h"
 #include "panels/WidgetDetails.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/kw/String.h"
 
 class ModalShade;
+class PanelTitleTextBox;
 class configb;
 
 class StandardPanel : public rect {
@@ -165,8 +168,7 @@ class StandardPanel : public rect {
   // The width left for the title box between the left border and the title buttons.
   int calcMaxTitleWidgetWidth() const;
   // The title box, or null.
-  PanelTitleBox* titleBox() const;
-  static void setTitleBoxFactory(PanelTitleBoxFactory factory);
+  PanelTitleTextBox* titleBox() const;
 
   // --- Size, pinning and modal display ---
   size_state getSizeState() const { return sizeState_; }
@@ -211,7 +213,8 @@ class StandardPanel : public rect {
   void leaveModal();
   void applySizeState(size_state state);
   void createStandardButtons(int flags);
-  void createTitleBox(int flags);
+  // Makes, re-styles or deletes the title box to match the title flags.
+  void syncTitleBox();
   // The left edge of the title buttons (less the gap), or the right end of the strip.
   int titleButtonsLeft() const;
   void syncSizeButton();
