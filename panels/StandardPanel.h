@@ -5,9 +5,12 @@
 // operations, modal display over a shade, and a tab order for its children.
 //
 // Choices made here:
-// - Layout arithmetic (origins, anchoring of widgets at top and right origins, relative
-//   placement) is in PanelGeometry.h. Every child is placed again whenever something it
-//   depends on changes: the panel's size, border or strips, or its reference widget.
+// - The panel is built of pieces: PanelWidgetList keeps the children and places them by the
+//   arithmetic of PanelGeometry.h (origins, anchoring at top and right origins, relative
+//   placement); PanelStandardWidgets makes, lays out and keeps in step the standard widgets;
+//   StandardPanelDrawing.cpp holds the panel's look. Every child is placed again whenever
+//   something it depends on changes: the panel's size, border or strips, or its reference
+//   widget.
 // - addWidget's last argument names the widget after which the new one goes in the widget
 //   list and in the tab order; null (or a widget not in the list) appends.
 // - A child that is a TabOrderable joins the panel's tab order when it is added and leaves it
@@ -50,11 +53,13 @@
 #include "foundation/TabOrderManager.h"
 #include "foundation/rect.h"
 #include "panels/PanelGeometry.h"
+#include "panels/PanelWidgetList.h"
 #include "panels/WidgetDetails.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/kw/String.h"
 
 class ModalShade;
+class PanelStandardWidgets;
 class PanelTitleTextBox;
 class configb;
 
@@ -163,7 +168,7 @@ class StandardPanel : public rect {
   void addStandardWidgets(int flags);
   // Clears the flags and deletes their widgets; `redraw` repaints the panel afterwards.
   void removeStandardWidgets(int flags, bool redraw);
-  int getStandardWidgetFlags() const { return stdFlags_; }
+  int getStandardWidgetFlags() const;
   void positionStandardWidgets();
   // The width left for the title box between the left border and the title buttons.
   int calcMaxTitleWidgetWidth() const;
@@ -187,46 +192,30 @@ class StandardPanel : public rect {
   Glob* standardWidget(StandardWidgetFlag flag) const;
 
  private:
-  struct StandardWidgets;
-  static constexpr int kTitleMargin = 5;  // from the border to the outermost title widget
-  static constexpr int kTitleGap = 2;     // between neighbouring title widgets
-  static constexpr unsigned short kTitleBoxHeight = 20;
+  static constexpr int kTitleMargin = PanelGeometry::kTitleMargin;
 
   void init();
-  void placeWidget(WidgetDetails& d);
   // The widget's box grown by its surround ring, where it stands now.
   Kw::Box<int> outerBoxOf(const WidgetDetails& d) const;
-  WidgetDetails* findLive(const Glob* widget);
-  const WidgetDetails* findLive(const Glob* widget) const;
-  // A live entry, else the entry of a deleted child that had this address.
-  WidgetDetails* findAny(const Glob* widget);
-  bool ownsCanvasOf(const Glob* widget) const;
-  bool isAncestorOrSelf(const Glob* g) const;
-  bool canAdopt(Glob* widget) const;
-  WidgetDetails& insertDetails(const WidgetDetails& d, Glob* insertAfter);
   // Enters a new widget in the list and the tab order, places it and announces it.
   void adopt(const WidgetDetails& details, Glob* insertAfter);
-  void makeAbsolute(WidgetDetails& d);
   void joinTabOrder(Glob* widget, Glob* insertAfter);
+  // Places the children again and repaints after an edit that changed a rule; false when the
+  // edit was refused.
+  bool relayoutAfter(PanelWidgetList::Edit edit);
   int reactToMessage(Event* e);
   void enterModal();
   void leaveModal();
   void applySizeState(size_state state);
-  void createStandardButtons(int flags);
-  // Makes, re-styles or deletes the title box to match the title flags.
-  void syncTitleBox();
   // The left edge of the title buttons (less the gap), or the right end of the strip.
   int titleButtonsLeft() const;
-  void syncSizeButton();
-  void syncPinButton();
 
   UifTypeOfBorder border_ = UifBorderNone;
-  int stdFlags_ = 0;
-  std::vector<WidgetDetails> widgets_;
+  PanelWidgetList widgets_{*this};
   XY<int> minSize_;
   WString title_;
   TabOrderManager tabOrder_;
-  std::unique_ptr<StandardWidgets> std_;
+  std::unique_ptr<PanelStandardWidgets> std_;
 
   // Size.
   size_state sizeState_ = SizeFull;
