@@ -21,11 +21,6 @@ namespace {
 
 constexpr int kShadeAlpha8 = 150;  // how much of the screen the modal shade hides, of 255
 
-Canvas* screenCanvas() {
-  RootGlob* r = RootGlob::current();
-  return r ? r->canvas() : nullptr;
-}
-
 GlobCreationInfo makeInfo(unsigned short width, unsigned short height, const Palette* palette,
                           Canvas* parent) {
   GlobCreationInfo info(width, height, parent);
@@ -51,8 +46,7 @@ unsigned short dimensionFromConfig(const configb& config, const char* key, unsig
 GlobCreationInfo infoFromConfig(const configb& config, unsigned short width, unsigned short height,
                                 Canvas* parent) {
   GlobCreationInfo info(dimensionFromConfig(config, "width", width),
-                        dimensionFromConfig(config, "height", height),
-                        parent ? parent : screenCanvas());
+                        dimensionFromConfig(config, "height", height), parent);
   info.x = config_int(config, "x", 0);
   info.y = config_int(config, "y", 0);
   return info;
@@ -67,7 +61,7 @@ bool startsWith(const String& s, const char* prefix) {
 // --- Construction ---
 
 StandardPanel::StandardPanel(unsigned short width, unsigned short height)
-    : rect(makeInfo(width, height, nullptr, screenCanvas())) {
+    : rect(makeInfo(width, height, nullptr, nullptr)) {
   init();
 }
 
@@ -448,10 +442,15 @@ void StandardPanel::enterModal() {
     Colour shade = getPalette().windowShade(0);
     shade.a = kShadeAlpha8 / 255.0;
     shade_ = new ModalShade(*screen, shade);
+    screen->followScreenSize(shade_.get());
     // The shade is now on top of the screen; lift this panel's top-level ancestor above it.
     Glob* top = this;
     while (top->parent() && top->parent() != screen) top = top->parent();
     top->pop_to_top();
+    // The shade stops the pointer; the scope stops keys, Tab included, reaching what lies
+    // beneath it.
+    screen->addInputScope(this);
+    modalScreen_ = screen;
   }
   refresh_on();
 }
@@ -460,6 +459,8 @@ void StandardPanel::leaveModal() {
   refresh_off();
   if (ModalShade* shade = shade_.get()) delete shade;
   shade_.reset();
+  if (auto* screen = dynamic_cast<RootGlob*>(modalScreen_.get())) screen->removeInputScope(this);
+  modalScreen_.reset();
   setDismissable(savedDismissable_);
   if (Glob* pin = modalPin_.get()) pin->setActive(savedPinActive_, true);
   modalPin_.reset();

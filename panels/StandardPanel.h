@@ -25,9 +25,10 @@
 //   place on the canvas.
 // - The size and border of the configuration-record constructor come from the keys "width",
 //   "height" (the arguments are their defaults), "x", "y", "border" and "title".
-// - Constructors without a canvas put the panel on the current screen (unattached when there
-//   is none). The bool of the palette forms is the panel's initial dismissable state.
-//   Panels start pinned (not dismissable) unless told otherwise.
+// - Constructors without a canvas make an unattached panel, on no screen, until it is put
+//   somewhere: addWidget on another panel, or RootGlob::adopt for the screen. The bool of the
+//   palette forms is the panel's initial dismissable state. Panels start pinned (not dismissable)
+//   unless told otherwise.
 // - Minimum size: reshape_canvas never makes the panel smaller than it (except when
 //   minimised); setMinSize grows the panel if it is smaller; resetMinSize removes the limit.
 // - Minimising (size flag SizeMinimised) keeps the top edge where it is, shrinks the panel to
@@ -37,8 +38,11 @@
 // - Modal display: setModal returns the depth after the call. Leaving depth 1 removes the
 //   shade and restores the pin state and the pin button's active state saved on entry.
 //   setModal(false) at depth 0 changes nothing and returns 0. The shade covers the panel's
-//   screen; the panel's top-level ancestor (the panel itself for a panel on the screen) is
-//   raised above it. A panel on no screen counts depth but shows no shade.
+//   screen, and keeps covering it when the screen changes size; the panel's top-level
+//   ancestor (the panel itself for a panel on the screen) is raised above it. While modal the
+//   panel is its screen's input scope: keys for a focus behind the shade come to the panel
+//   (so Tab moves into its own tab order), and nothing bubbles out of it. A panel on no
+//   screen counts depth but shows no shade and holds no input.
 // - The pin button latches and is given the message "pin", so that it reports "pin on" and
 //   "pin off"; it is kept down while the panel is pinned. The title buttons take the panel's
 //   palette; the do-it button keeps the standard button look.
@@ -229,4 +233,5 @@ class StandardPanel : public rect {
   bool savedPinActive_ = true;
   GlobHandle<> modalPin_;
   GlobHandle<ModalShade> shade_;
+  GlobHandle<> modalScreen_;  // the screen whose input the panel holds while modal
 };
