@@ -1,6 +1,5 @@
 #include "gallery/GalleryPages.h"
 #include "panels/StandardPanel.h"
-#include "text/PanelTitleTextBox.h"
 #include "text/TextBox.h"
 
 namespace {
@@ -37,8 +36,6 @@ TextBox* addBoxCard(GalleryPage& page, int column, int row, const String& title,
 // The single-line text box in its variants, each in its own card; every callback event they
 // raise shows in the message log. A panel below has an editable title box.
 void buildTextPage(GalleryPage& page) {
-  PanelTitleTextBox::install();
-
   TextBox::InitArgs plain;
   plain.text = L"Scene 12, take 3";
   addBoxCard(page, 0, 0, "EDITABLE", "editable", plain);

@@ -67,9 +67,6 @@ int main(int argc, char** argv) {
     return 0;
   }
 
-  // Every panel of every page gets an editable title box when it asks for one.
-  PanelTitleTextBox::install();
-
   MessageLog log;
   if (!options.logFile.empty() && !log.attachFile(options.logFile)) return 1;
 

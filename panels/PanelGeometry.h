@@ -34,6 +34,10 @@ class PanelGeometry {
   static constexpr int kTitleStripHeight = 26;
   static constexpr int kBottomStripHeight = 27;
   static constexpr int kSurroundWidth = 2;
+  // In the title strip: from the border to the outermost title widget, and between
+  // neighbouring title widgets.
+  static constexpr int kTitleMargin = 5;
+  static constexpr int kTitleGap = 2;
 
   // 1 → 5, 2 → 10, 3 → 6, anything else → 0.
   static int borderSize(UifTypeOfBorder border);

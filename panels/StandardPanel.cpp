@@ -6,39 +6,20 @@
 
 #include "buttons/Button.h"
 #include "buttons/PinButton.h"
-#include "buttons/PootButton.h"
-#include "buttons/SettingsButton.h"
-#include "buttons/SizeButton.h"
 #include "panels/ModalShade.h"
-#include "platform/glib/FontCache.h"
-#include "platform/glib/Painter.h"
+#include "panels/PanelStandardWidgets.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/misc/Config.h"
 #include "platform/misc/Diagnostics.h"
-#include "platform/misc/UIString.h"
 #include "platform/misc/configb.h"
+#include "text/PanelTitleTextBox.h"
 
 const char* const StandardPanel::doItMsg = "do_it";
 const char* const StandardPanel::titleChangedMsg = "StdPanelTitleChanged";
 
 namespace {
 
-constexpr int kShadeAlpha8 = 150;
-constexpr unsigned short kTitleButtonSize = 20;
-constexpr unsigned short kPinWidth = 16;
-constexpr unsigned short kPinHeight = 20;
-constexpr unsigned short kDoItWidth = 80;
-constexpr unsigned short kDoItHeight = 22;
-constexpr unsigned kDoItLabelId = 41;  // how much of the screen the modal shade hides, of 255
-
-PanelTitleBoxFactory& titleBoxFactory() {
-  static PanelTitleBoxFactory factory;
-  return factory;
-}
-
-Canvas* screenCanvas() {
-  return nullptr;
-}
+constexpr int kShadeAlpha8 = 150;  // how much of the screen the modal shade hides, of 255
 
 GlobCreationInfo makeInfo(unsigned short width, unsigned short height, const Palette* palette,
                           Canvas* parent) {
@@ -65,8 +46,7 @@ unsigned short dimensionFromConfig(const configb& config, const char* key, unsig
 GlobCreationInfo infoFromConfig(const configb& config, unsigned short width, unsigned short height,
                                 Canvas* parent) {
   GlobCreationInfo info(dimensionFromConfig(config, "width", width),
-                        dimensionFromConfig(config, "height", height),
-                        parent ? parent : screenCanvas());
+                        dimensionFromConfig(config, "height", height), parent);
   info.x = config_int(config, "x", 0);
   info.y = config_int(config, "y", 0);
   return info;
@@ -78,23 +58,10 @@ bool startsWith(const String& s, const char* prefix) {
 
 }  // namespace
 
-// The title widgets the panel owns, each present only while its flag is set.
-struct StandardPanel::StandardWidgets {
-  GlobHandle<PootButton> poot;
-  GlobHandle<SettingsButton> settings;
-  GlobHandle<SizeButton> size;
-  GlobHandle<PinButton> pin;
-  GlobHandle<Button> doIt;
-  GlobHandle<> titleGlob;
-  std::unique_ptr<PanelTitleBox> title;
-
-  Glob* titleBoxGlob() const { return title ? titleGlob.get() : nullptr; }
-};
-
 // --- Construction ---
 
 StandardPanel::StandardPanel(unsigned short width, unsigned short height)
-    : rect(makeInfo(width, height, nullptr, screenCanvas())) {
+    : rect(makeInfo(width, height, nullptr, nullptr)) {
   init();
 }
 
@@ -124,19 +91,16 @@ StandardPanel::StandardPanel(const GlobCreationInfo& info) : rect(info) {
 }
 
 void StandardPanel::init() {
-  std_ = std::make_unique<StandardWidgets>();
+  std_ = std::make_unique<PanelStandardWidgets>(*this);
   fullHeight_ = height();
   canvas()->setOpaque(getcol().a >= 1.0);
 }
 
 StandardPanel::~StandardPanel() {
   while (modalDepth_ > 0) setModal(false);
-  std_->title.reset();
-  std::vector<WidgetDetails> list;
-  list.swap(widgets_);
-  for (WidgetDetails& d : list) {
+  for (WidgetDetails& d : widgets_.takeAll()) {
     if (Glob* g = d.get()) {
-      if (ownsCanvasOf(g)) delete g;
+      if (widgets_.onPanel(g)) delete g;
     } else {
       Diagnostics::print(kDoubleDeletionLevel, "glob double deletion(2)\n");
     }
@@ -167,7 +131,7 @@ void StandardPanel::setBorderStyle(UifTypeOfBorder border) {
 void StandardPanel::setTitle(const WString& title) {
   if (title == title_) return;
   title_ = title;
-  if (std_->titleBoxGlob()) std_->title->setText(title_);
+  std_->showTitle(title_);
   update();
 }
 
@@ -212,15 +176,16 @@ void StandardPanel::applySizeState(size_state state) {
     hiddenByMinimise_.clear();
     std::vector<Glob*> hide;
     getChildren(hide);
-    if (Glob* doIt = std_->doIt.get()) hide.push_back(doIt);
+    if (Glob* doIt = std_->doIt()) hide.push_back(doIt);
     for (Glob* g : hide) {
       if (!g->isVisible()) continue;
       g->unmap_canvas();
       hiddenByMinimise_.emplace_back(g);
     }
     sizeState_ = state;
-    const int h = 2 * calcBorderSize(border_) +
-                  (PanelGeometry::hasTitleStrip(stdFlags_) ? PanelGeometry::kTitleStripHeight : 0);
+    const int h =
+        2 * calcBorderSize(border_) +
+        (PanelGeometry::hasTitleStrip(std_->flags()) ? PanelGeometry::kTitleStripHeight : 0);
     reshape_canvas(r.x0, r.y1 - h, r.width(), h);
   } else {
     sizeState_ = state;
@@ -230,7 +195,7 @@ void StandardPanel::applySizeState(size_state state) {
     }
     hiddenByMinimise_.clear();
   }
-  syncSizeButton();
+  std_->syncSizeButton();
   update();
 }
 
@@ -238,7 +203,7 @@ void StandardPanel::applySizeState(size_state state) {
 
 PanelFrame StandardPanel::frame() const {
   PanelFrame f;
-  f.flags = stdFlags_;
+  f.flags = std_->flags();
   f.size = XY<int>(width(), height());
   f.border = border_;
   return f;
@@ -263,57 +228,9 @@ Kw::Box<int> StandardPanel::getUserArea(int flags, XY<int> size, UifTypeOfBorder
 
 // --- Children ---
 
-WidgetDetails* StandardPanel::findLive(const Glob* widget) {
-  if (!widget) return nullptr;
-  for (WidgetDetails& d : widgets_) {
-    if (d.get() == widget) return &d;
-  }
-  return nullptr;
-}
-
-const WidgetDetails* StandardPanel::findLive(const Glob* widget) const {
-  return const_cast<StandardPanel*>(this)->findLive(widget);
-}
-
-WidgetDetails* StandardPanel::findAny(const Glob* widget) {
-  if (WidgetDetails* d = findLive(widget)) return d;
-  if (!widget) return nullptr;
-  for (WidgetDetails& d : widgets_) {
-    if (!d.get() && d.address == widget) return &d;
-  }
-  return nullptr;
-}
-
-bool StandardPanel::ownsCanvasOf(const Glob* widget) const {
-  return widget->canvas()->parent() == canvas();
-}
-
-bool StandardPanel::isAncestorOrSelf(const Glob* g) const {
-  for (const Glob* p = this; p; p = p->parent()) {
-    if (p == g) return true;
-  }
-  return false;
-}
-
-bool StandardPanel::canAdopt(Glob* widget) const {
-  return is_good_glob_ptr(widget) && !isAncestorOrSelf(widget) && !widget->canvas()->isRoot() &&
-         !findLive(widget);
-}
-
-WidgetDetails& StandardPanel::insertDetails(const WidgetDetails& d, Glob* insertAfter) {
-  Glob* widget = d.get();
-  if (!ownsCanvasOf(widget)) widget->canvas()->reparent(canvas());
-  auto at = widgets_.end();
-  if (const WidgetDetails* after =
-          is_good_glob_ptr(insertAfter) ? findLive(insertAfter) : nullptr) {
-    at = widgets_.begin() + (after - widgets_.data()) + 1;
-  }
-  return *widgets_.insert(at, d);
-}
-
 bool StandardPanel::addWidget(Glob* widget, XY<int> pos, CoordinateOrigin origin,
                               WidgetSurround surround, Glob* insertAfter) {
-  if (!canAdopt(widget) || !PanelGeometry::isValidOrigin(origin)) return false;
+  if (!widgets_.canAdopt(widget) || !PanelGeometry::isValidOrigin(origin)) return false;
   WidgetDetails d;
   d.widget = widget;
   d.address = widget;
@@ -332,7 +249,9 @@ bool StandardPanel::addWidget(Glob* widget, int x, int y, CoordinateOrigin origi
 bool StandardPanel::addWidgetRelative(Glob* widget, Glob* reference, unsigned gap,
                                       WidgetRelativity relativity, WidgetSurround surround,
                                       WidgetAlignment alignment) {
-  if (!canAdopt(widget) || !findLive(reference) || reference == widget) return false;
+  if (!widgets_.canAdopt(widget) || !widgets_.findLive(reference) || reference == widget) {
+    return false;
+  }
   if (relativity < PlaceAbove || relativity > PlaceRightOf) return false;
   if (!PanelGeometry::alignmentFits(relativity, alignment)) return false;
   WidgetDetails d;
@@ -350,7 +269,7 @@ bool StandardPanel::addWidgetRelative(Glob* widget, Glob* reference, unsigned ga
 }
 
 void StandardPanel::adopt(const WidgetDetails& details, Glob* insertAfter) {
-  const WidgetDetails added = insertDetails(details, insertAfter);
+  const WidgetDetails added = widgets_.insert(details, insertAfter);
   recalculateWidgetPositions();
   joinTabOrder(details.widget.get(), insertAfter);
   update();
@@ -374,14 +293,8 @@ void StandardPanel::joinTabOrder(Glob* widget, Glob* insertAfter) {
 }
 
 bool StandardPanel::removeWidget(Glob* widget, bool destroy) {
-  WidgetDetails* d = findAny(widget);
-  if (!d) return false;
-  Glob* live = d->get();
-  const size_t index = static_cast<size_t>(d - widgets_.data());
-  for (WidgetDetails& other : widgets_) {
-    if (other.relative && other.reference.refersTo(live)) makeAbsolute(other);
-  }
-  widgets_.erase(widgets_.begin() + static_cast<std::ptrdiff_t>(index));
+  Glob* live = nullptr;
+  if (!widgets_.remove(widget, live)) return false;
   if (live) {
     if (auto* stop = dynamic_cast<TabOrderable*>(live)) tabOrder_.removeTabStop(*stop);
     if (destroy) delete live;
@@ -390,65 +303,42 @@ bool StandardPanel::removeWidget(Glob* widget, bool destroy) {
   return true;
 }
 
-void StandardPanel::makeAbsolute(WidgetDetails& d) {
-  d.relative = false;
-  d.reference.reset();
-  d.origin = OriginBottomLeft;
-  if (Glob* g = d.get()) {
-    d.pos = XY<int>(g->canvas()->rect().x0, g->canvas()->rect().y0);
+bool StandardPanel::relayoutAfter(PanelWidgetList::Edit edit) {
+  if (edit == PanelWidgetList::Edit::Changed) {
+    recalculateWidgetPositions();
+    update();
   }
+  return edit != PanelWidgetList::Edit::Refused;
 }
 
 bool StandardPanel::setWidgetPos(Glob* widget, XY<int> pos) {
-  WidgetDetails* d = findLive(widget);
-  if (!d) return false;
-  return setWidgetPos(widget, pos, d->relative ? OriginBottomLeft : d->origin);
+  CoordinateOrigin origin = OriginBottomLeft;
+  if (!widgets_.currentOrigin(widget, origin)) return false;
+  return setWidgetPos(widget, pos, origin);
 }
 
 bool StandardPanel::setWidgetPos(Glob* widget, XY<int> pos, CoordinateOrigin origin) {
-  WidgetDetails* d = findLive(widget);
-  if (!d || !PanelGeometry::isValidOrigin(origin)) return false;
-  if (!d->relative && d->pos == pos && d->origin == origin) return true;
-  d->relative = false;
-  d->reference.reset();
-  d->pos = pos;
-  d->origin = origin;
-  recalculateWidgetPositions();
-  update();
-  return true;
+  return relayoutAfter(widgets_.setPos(widget, pos, origin));
 }
 
 bool StandardPanel::translateWidgetPos(Glob* widget, int dx, int dy) {
-  WidgetDetails* d = findLive(widget);
-  if (!d) return false;
-  if (dx == 0 && dy == 0) return true;
-  if (d->relative) makeAbsolute(*d);
-  d->pos = PanelGeometry::translateOffset(d->origin, d->pos, dx, dy);
-  recalculateWidgetPositions();
-  update();
-  return true;
+  return relayoutAfter(widgets_.translate(widget, dx, dy));
 }
 
 bool StandardPanel::setWidgetBorderStyle(Glob* widget, WidgetSurround surround) {
-  WidgetDetails* d = findLive(widget);
-  if (!d) return false;
-  if (d->surround == surround) return true;
-  d->surround = surround;
-  recalculateWidgetPositions();
-  update();
-  return true;
+  return relayoutAfter(widgets_.setSurround(widget, surround));
 }
 
 const WidgetDetails* StandardPanel::getWidget(const Glob* widget) const {
-  return const_cast<StandardPanel*>(this)->findAny(widget);
+  return widgets_.findAny(widget);
 }
 
 const WidgetDetails* StandardPanel::getWidget(unsigned index) const {
-  return index < widgets_.size() ? &widgets_[index] : nullptr;
+  return widgets_.at(index);
 }
 
 bool StandardPanel::isChildWidget(const Glob* widget) const {
-  return findLive(widget) != nullptr;
+  return widgets_.findLive(widget) != nullptr;
 }
 
 void StandardPanel::getChildren(std::vector<Glob*>& out) const {
@@ -458,40 +348,12 @@ void StandardPanel::getChildren(std::vector<Glob*>& out) const {
 }
 
 Kw::Box<int> StandardPanel::outerBoxOf(const WidgetDetails& d) const {
-  const Glob* g = d.get();
-  if (!g) return Kw::Box<int>();
-  const int s = PanelGeometry::surroundWidth(d.surround);
-  const Kw::Box<int>& r = g->canvas()->rect();
-  return Kw::Box<int>(r.x0 - s, r.y0 - s, r.x1 + s, r.y1 + s);
-}
-
-void StandardPanel::placeWidget(WidgetDetails& d) {
-  Glob* g = d.get();
-  if (!g || !ownsCanvasOf(g)) return;
-  const XY<int> size(g->width(), g->height());
-  XY<int> corner;
-  if (d.relative) {
-    const WidgetDetails* ref = findLive(d.reference.get());
-    if (!ref || !ownsCanvasOf(ref->get())) {
-      makeAbsolute(d);
-      return;
-    }
-    const int s = PanelGeometry::surroundWidth(d.surround);
-    const Kw::Box<int> outer =
-        PanelGeometry::placeRelative(outerBoxOf(*ref), XY<int>(size.x + 2 * s, size.y + 2 * s),
-                                     d.gap, d.relativity, d.alignment);
-    corner = XY<int>(outer.x0 + s, outer.y0 + s);
-  } else {
-    corner = PanelGeometry::placeFromOrigin(d.origin, d.pos, size, frame());
-  }
-  const Kw::Box<int>& r = g->canvas()->rect();
-  if (r.x0 != corner.x || r.y0 != corner.y) g->translate_canvas(corner.x - r.x0, corner.y - r.y0);
+  return widgets_.outerBoxOf(d);
 }
 
 void StandardPanel::recalculateWidgetPositions() {
   positionStandardWidgets();
-  // Index loop: a child may be deleted while it is being moved, never added.
-  for (size_t i = 0; i < widgets_.size(); ++i) placeWidget(widgets_[i]);
+  widgets_.placeAll();
 }
 
 // --- Tab order ---
@@ -508,184 +370,40 @@ bool StandardPanel::decrementTab() {
 
 // --- Standard widgets ---
 
-void StandardPanel::setTitleBoxFactory(PanelTitleBoxFactory factory) {
-  titleBoxFactory() = std::move(factory);
-}
-
-PanelTitleBox* StandardPanel::titleBox() const {
-  return std_->titleBoxGlob() ? std_->title.get() : nullptr;
+PanelTitleTextBox* StandardPanel::titleBox() const {
+  return std_->titleBox();
 }
 
 Glob* StandardPanel::standardWidget(StandardWidgetFlag flag) const {
-  switch (flag) {
-    case StdPootButton:
-      return std_->poot.get();
-    case StdSettingsButton:
-      return std_->settings.get();
-    case StdSizeButton:
-      return std_->size.get();
-    case StdDoItButton:
-      return std_->doIt.get();
-    case StdPinButton:
-      return std_->pin.get();
-    case StdTitleBox:
-    case StdEditableTitleBox:
-      return std_->titleBoxGlob();
-  }
-  return nullptr;
+  return std_->widget(flag);
+}
+
+int StandardPanel::getStandardWidgetFlags() const {
+  return std_->flags();
 }
 
 void StandardPanel::addStandardWidgets(int flags) {
-  flags &= kStdAllFlags;
-  stdFlags_ |= flags;
-  createStandardButtons(stdFlags_);
-  createTitleBox(stdFlags_);
+  std_->add(flags);
   recalculateWidgetPositions();
   update();
 }
 
-void StandardPanel::createStandardButtons(int flags) {
-  Canvas* c = canvas();
-  const Palette& pal = getPalette();
-  // Title buttons take the panel's colours, so that they sit in its title strip.
-  auto restyle = [&pal](Button* b) {
-    b->setPalette(pal);
-    b->setcols(pal.get(Palette::WindowText), pal.windowShade(4));
-  };
-  if ((flags & StdPootButton) && !std_->poot) {
-    auto* b = new PootButton(kTitleButtonSize, 0, c);
-    restyle(b);
-    std_->poot = b;
-  }
-  if ((flags & StdSizeButton) && !std_->size) {
-    auto* b = new SizeButton(sizeState_ == SizeMinimised, kTitleButtonSize, 0, c);
-    restyle(b);
-    std_->size = b;
-  }
-  if ((flags & StdPinButton) && !std_->pin) {
-    auto* b = new PinButton(kPinWidth, kPinHeight, c);
-    restyle(b);
-    b->setTransparentBackground(true);
-    // A latching button reports its message + " on" / " off": "pin on" pins the panel.
-    b->set_message("pin");
-    b->set_state(isPinned() ? kButtonDown : kButtonUp, false);
-    std_->pin = b;
-  }
-  if ((flags & StdSettingsButton) && !std_->settings) {
-    auto* b = new SettingsButton(kTitleButtonSize, 0, c);
-    restyle(b);
-    b->setTransparentBackground(true);
-    std_->settings = b;
-  }
-  if ((flags & StdDoItButton) && !std_->doIt) {
-    std_->doIt =
-        new Button(UIString(kDoItLabelId).toWString(), doItMsg, kDoItWidth, kDoItHeight, 0, c);
-  }
-}
-
-void StandardPanel::createTitleBox(int flags) {
-  if (!(flags & (StdTitleBox | StdEditableTitleBox)) || std_->titleBoxGlob()) return;
-  std_->title.reset();
-  const PanelTitleBoxFactory& factory = titleBoxFactory();
-  if (!factory) return;
-  const bool editable = (flags & StdEditableTitleBox) != 0;
-  std::unique_ptr<PanelTitleBox> box =
-      factory(*this, toDimension(calcMaxTitleWidgetWidth()), kTitleBoxHeight, editable);
-  Glob* g = box ? box->glob() : nullptr;
-  if (!is_good_glob_ptr(g)) return;
-  if (!ownsCanvasOf(g)) g->canvas()->reparent(canvas());
-  std_->titleGlob = g;
-  std_->title = std::move(box);
-}
-
 void StandardPanel::removeStandardWidgets(int flags, bool redraw) {
-  flags &= stdFlags_;
-  if (!flags) return;
-  stdFlags_ &= ~flags;
-  auto drop = [](auto& h) {
-    if (Glob* g = h.get()) delete g;
-    h.reset();
-  };
-  if (flags & StdPootButton) drop(std_->poot);
-  if (flags & StdSettingsButton) drop(std_->settings);
-  if (flags & StdSizeButton) drop(std_->size);
-  if (flags & StdDoItButton) drop(std_->doIt);
-  if (flags & StdPinButton) drop(std_->pin);
-  // One box serves both title flags: it goes with the last of them.
-  if (!(stdFlags_ & (StdTitleBox | StdEditableTitleBox))) {
-    std_->title.reset();
-    drop(std_->titleGlob);
-  }
+  if (!std_->remove(flags)) return;
   recalculateWidgetPositions();
   if (redraw) update();
 }
 
 int StandardPanel::titleButtonsLeft() const {
-  const int right = width() - calcBorderSize(border_) - kTitleMargin;
-  int left = right;
-  const Glob* buttons[] = {std_->poot.get(), std_->size.get(), std_->pin.get(),
-                           std_->settings.get()};
-  for (const Glob* g : buttons) {
-    if (g && ownsCanvasOf(g)) left = std::min(left, g->canvas()->rect().x0 - kTitleGap);
-  }
-  return left;
+  return std_->titleButtonsLeft();
 }
 
 int StandardPanel::calcMaxTitleWidgetWidth() const {
-  const int left = calcBorderSize(border_) + kTitleMargin;
-  return std::max(0, titleButtonsLeft() - left);
+  return std_->maxTitleWidth();
 }
 
 void StandardPanel::positionStandardWidgets() {
-  const Kw::Box<int> strip = PanelGeometry::titleStrip(frame());
-  auto centreY = [&strip](const Glob* g) { return strip.y0 + (strip.height() - g->height()) / 2; };
-  auto moveTo = [this](Glob* g, int x, int y) {
-    const Kw::Box<int>& r = g->canvas()->rect();
-    if (ownsCanvasOf(g) && (r.x0 != x || r.y0 != y)) g->translate_canvas(x - r.x0, y - r.y0);
-  };
-
-  // From the top-right corner leftwards: close, size, pin, settings, each against the nearest
-  // earlier one (the size button against the close button only while that shows).
-  const int corner = strip.x1 - kTitleMargin;
-  Glob* poot = std_->poot.get();
-  Glob* size = std_->size.get();
-  Glob* pin = std_->pin.get();
-  Glob* settings = std_->settings.get();
-  auto leftOf = [corner](const Glob* anchor) {
-    return anchor ? anchor->canvas()->rect().x0 - kTitleGap : corner;
-  };
-  if (poot) moveTo(poot, corner - poot->width(), centreY(poot));
-  if (size) {
-    const Glob* anchor = poot && poot->isVisible() ? poot : nullptr;
-    moveTo(size, leftOf(anchor) - size->width(), centreY(size));
-  }
-  if (pin) {
-    const Glob* anchor = size ? size : poot;
-    moveTo(pin, leftOf(anchor) - pin->width(), centreY(pin));
-  }
-  if (settings) {
-    const Glob* anchor = pin ? pin : size ? size : poot;
-    moveTo(settings, leftOf(anchor) - settings->width(), centreY(settings));
-  }
-  if (Glob* box = std_->titleBoxGlob()) {
-    const int w = calcMaxTitleWidgetWidth();
-    const int x = calcBorderSize(border_) + kTitleMargin;
-    const Kw::Box<int>& r = box->canvas()->rect();
-    if (r.x0 != x || r.y0 != centreY(box) || r.width() != w) {
-      box->reshape_canvas(x, centreY(box), w, box->height());
-    }
-  }
-  if (Glob* doIt = std_->doIt.get()) {
-    const Kw::Box<int> bottom = PanelGeometry::bottomStrip(frame());
-    moveTo(doIt, bottom.x1 - kTitleMargin - doIt->width(),
-           bottom.y0 + (bottom.height() - doIt->height()) / 2);
-  }
-}
-
-void StandardPanel::syncSizeButton() {
-  SizeButton* b = std_->size.get();
-  const bool minimised = sizeState_ == SizeMinimised;
-  if (b && b->get_size() != minimised) b->set_size(minimised);
+  std_->position();
 }
 
 // --- Pinning and modal display ---
@@ -693,13 +411,7 @@ void StandardPanel::syncSizeButton() {
 void StandardPanel::setDismissable(bool dismissable) {
   if (dismissable == dismissable_) return;
   dismissable_ = dismissable;
-  syncPinButton();
-}
-
-void StandardPanel::syncPinButton() {
-  PinButton* b = std_->pin.get();
-  const button_state shown = isPinned() ? kButtonDown : kButtonUp;
-  if (b && b->get_state() != shown) b->set_state(shown, true);
+  std_->syncPinButton();
 }
 
 Glob* StandardPanel::modalShade() const {
@@ -719,7 +431,7 @@ int StandardPanel::setModal(bool modal) {
 void StandardPanel::enterModal() {
   refresh_off();
   savedDismissable_ = dismissable_;
-  Glob* pin = std_->pin.get();
+  Glob* pin = std_->pin();
   modalPin_ = pin;
   if (pin) {
     savedPinActive_ = pin->isActive();
@@ -730,10 +442,15 @@ void StandardPanel::enterModal() {
     Colour shade = getPalette().windowShade(0);
     shade.a = kShadeAlpha8 / 255.0;
     shade_ = new ModalShade(*screen, shade);
+    screen->followScreenSize(shade_.get());
     // The shade is now on top of the screen; lift this panel's top-level ancestor above it.
     Glob* top = this;
     while (top->parent() && top->parent() != screen) top = top->parent();
     top->pop_to_top();
+    // The shade stops the pointer; the scope stops keys, Tab included, reaching what lies
+    // beneath it.
+    screen->addInputScope(this);
+    modalScreen_ = screen;
   }
   refresh_on();
 }
@@ -742,6 +459,8 @@ void StandardPanel::leaveModal() {
   refresh_off();
   if (ModalShade* shade = shade_.get()) delete shade;
   shade_.reset();
+  if (auto* screen = dynamic_cast<RootGlob*>(modalScreen_.get())) screen->removeInputScope(this);
+  modalScreen_.reset();
   setDismissable(savedDismissable_);
   if (Glob* pin = modalPin_.get()) pin->setActive(savedPinActive_, true);
   modalPin_.reset();
@@ -783,12 +502,12 @@ int StandardPanel::reactToMessage(Event* e) {
     handleFlipSize();
     return 1;
   }
-  if (std_->pin.alive() && (msg == "pin on" || msg == "pin off")) {
+  if (std_->pin() && (msg == "pin on" || msg == "pin off")) {
     setDismissable(msg == "pin off");
     return 1;
   }
   if (msg == titleChangedMsg && titleBox()) {
-    setTitle(titleBox()->text());
+    setTitle(titleBox()->getText());
     if (self) handleTitleChange();
     return 1;
   }
@@ -796,110 +515,4 @@ int StandardPanel::reactToMessage(Event* e) {
   const int handled = handleMessageEvent(msg, event_to_sender_glob(e));
   if (handled) return handled;
   return self ? rect::react(e) : 1;
-}
-
-// --- Drawing ---
-
-void StandardPanel::draw() {
-  drawBackground();
-  drawBorder();
-  drawWidgets();
-}
-
-namespace {
-
-// Fills the band between `outer` and the box `width` pixels inside it.
-void fillRing(Glib::Painter& p, const Kw::Box<int>& outer, int width, const Colour& c) {
-  const Kw::Box<int> inner(outer.x0 + width, outer.y0 + width, outer.x1 - width, outer.y1 - width);
-  p.fillRect(Kw::Box<int>(outer.x0, inner.y1, outer.x1, outer.y1), c);
-  p.fillRect(Kw::Box<int>(outer.x0, outer.y0, outer.x1, inner.y0), c);
-  p.fillRect(Kw::Box<int>(outer.x0, inner.y0, inner.x0, inner.y1), c);
-  p.fillRect(Kw::Box<int>(inner.x1, inner.y0, outer.x1, inner.y1), c);
-}
-
-Kw::Box<int> inset(const Kw::Box<int>& b, int d) {
-  return Kw::Box<int>(b.x0 + d, b.y0 + d, b.x1 - d, b.y1 - d);
-}
-
-}  // namespace
-
-void StandardPanel::drawBackground() {
-  Glib::Painter p(*canvas());
-  if (!p.active()) return;
-  const Palette& pal = getPalette();
-  p.fillRect(p.bounds(), getcol());
-  const PanelFrame f = frame();
-  const Kw::Box<int> title = PanelGeometry::titleStrip(f);
-  if (!title.empty()) {
-    // A slightly lighter band, lit from above, with an etched line under it.
-    p.verticalGradient(title, pal.windowShade(3), pal.windowShade(4));
-    p.fillRect(Kw::Box<int>(title.x0, title.y0, title.x1, title.y0 + 1), pal.get(Palette::Shadow));
-    p.fillRect(Kw::Box<int>(title.x0, title.y0 - 1, title.x1, title.y0), pal.windowShade(4));
-    if (!std_->titleBoxGlob() && !title_.empty()) {
-      const Kw::Box<int> textBox(title.x0 + kTitleMargin, title.y0 + 1, titleButtonsLeft(),
-                                 title.y1);
-      auto font =
-          Glib::fonts().get(Glib::FontDesc(String(), Glib::kDefaultFontSize, Glib::FontDesc::Bold));
-      p.text(title_, textBox, *font, pal.get(Palette::WindowText), TextAlignment::Left);
-    }
-  }
-  const Kw::Box<int> bottom = PanelGeometry::bottomStrip(f);
-  if (!bottom.empty()) {
-    p.fillRect(bottom, pal.windowShade(2));
-    p.fillRect(Kw::Box<int>(bottom.x0, bottom.y1 - 1, bottom.x1, bottom.y1),
-               pal.get(Palette::Shadow));
-  }
-}
-
-void StandardPanel::drawBorder() {
-  Glib::Painter p(*canvas());
-  if (!p.active()) return;
-  const Palette& pal = getPalette();
-  const Colour& light = pal.get(Palette::Light);
-  const Colour& shadow = pal.get(Palette::Shadow);
-  const Colour& edge = pal.get(Palette::Border);
-  const Kw::Box<int> all = p.bounds();
-  switch (border_) {
-    case UifBorderRaised:  // dark outline, 4-pixel raised bevel
-      p.outlineRect(all, edge);
-      p.depthBox(inset(all, 1), Glib::Bevel::Raised, 4, light, shadow);
-      break;
-    case UifBorderFramed:  // outline, raised bevel, flat band, sunken groove
-      p.outlineRect(all, edge);
-      p.depthBox(inset(all, 1), Glib::Bevel::Raised, 3, light, shadow);
-      fillRing(p, inset(all, 4), 4, pal.windowShade(2));
-      p.depthBox(inset(all, 8), Glib::Bevel::Sunken, 2, light, shadow);
-      break;
-    case UifBorderSunken:  // 5-pixel sunken well edged inside by a dark line
-      p.depthBox(all, Glib::Bevel::Sunken, 5, light, shadow);
-      p.outlineRect(inset(all, 5), edge);
-      break;
-    default:
-      break;
-  }
-}
-
-void StandardPanel::drawWidgets() {
-  Glib::Painter p(*canvas());
-  if (!p.active()) return;
-  const Palette& pal = getPalette();
-  for (const WidgetDetails& d : widgets_) {
-    if (d.surround == SurroundNone || !d.get() || !d.get()->isVisible()) continue;
-    const Kw::Box<int> outer = outerBoxOf(d);
-    const int w = PanelGeometry::kSurroundWidth;
-    switch (d.surround) {
-      case SurroundRaised:
-        p.depthBox(outer, Glib::Bevel::Raised, w, pal.get(Palette::Light),
-                   pal.get(Palette::Shadow));
-        break;
-      case SurroundSunken:
-        p.depthBox(outer, Glib::Bevel::Sunken, w, pal.get(Palette::Light),
-                   pal.get(Palette::Shadow));
-        break;
-      default:  // framed: a dark line round a light one
-        p.outlineRect(outer, pal.get(Palette::Border));
-        p.outlineRect(inset(outer, 1), pal.windowShade(5));
-        break;
-    }
-  }
 }

@@ -5,9 +5,12 @@
 // operations, modal display over a shade, and a tab order for its children.
 //
 // Choices made here:
-// - Layout arithmetic (origins, anchoring of widgets at top and right origins, relative
-//   placement) is in PanelGeometry.h. Every child is placed again whenever something it
-//   depends on changes: the panel's size, border or strips, or its reference widget.
+// - The panel is built of pieces: PanelWidgetList keeps the children and places them by the
+//   arithmetic of PanelGeometry.h (origins, anchoring at top and right origins, relative
+//   placement); PanelStandardWidgets makes, lays out and keeps in step the standard widgets;
+//   StandardPanelDrawing.cpp holds the panel's look. Every child is placed again whenever
+//   something it depends on changes: the panel's size, border or strips, or its reference
+//   widget.
 // - addWidget's last argument names the widget after which the new one goes in the widget
 //   list and in the tab order; null (or a widget not in the list) appends.
 // - A child that is a TabOrderable joins the panel's tab order when it is added and leaves it
@@ -22,9 +25,10 @@
 //   place on the canvas.
 // - The size and border of the configuration-record constructor come from the keys "width",
 //   "height" (the arguments are their defaults), "x", "y", "border" and "title".
-// - Constructors without a canvas put the panel on the current screen (unattached when there
-//   is none). The bool of the palette forms is the panel's initial dismissable state.
-//   Panels start pinned (not dismissable) unless told otherwise.
+// - Constructors without a canvas make an unattached panel, on no screen, until it is put
+//   somewhere: addWidget on another panel, or RootGlob::adopt for the screen. The bool of the
+//   palette forms is the panel's initial dismissable state. Panels start pinned (not dismissable)
+//   unless told otherwise.
 // - Minimum size: reshape_canvas never makes the panel smaller than it (except when
 //   minimised); setMinSize grows the panel if it is smaller; resetMinSize removes the limit.
 // - Minimising (size flag SizeMinimised) keeps the top edge where it is, shrinks the panel to
@@ -34,11 +38,17 @@
 // - Modal display: setModal returns the depth after the call. Leaving depth 1 removes the
 //   shade and restores the pin state and the pin button's active state saved on entry.
 //   setModal(false) at depth 0 changes nothing and returns 0. The shade covers the panel's
-//   screen; the panel's top-level ancestor (the panel itself for a panel on the screen) is
-//   raised above it. A panel on no screen counts depth but shows no shade.
+//   screen, and keeps covering it when the screen changes size; the panel's top-level
+//   ancestor (the panel itself for a panel on the screen) is raised above it. While modal the
+//   panel is its screen's input scope: keys for a focus behind the shade come to the panel
+//   (so Tab moves into its own tab order), and nothing bubbles out of it. A panel on no
+//   screen counts depth but shows no shade and holds no input.
 // - The pin button latches and is given the message "pin", so that it reports "pin on" and
 //   "pin off"; it is kept down while the panel is pinned. The title buttons take the panel's
 //   palette; the do-it button keeps the standard button look.
+// - The title box is a PanelTitleTextBox that the panel makes itself. One box serves both
+//   title flags: editable while 0x40 is set, read-only with 0x20 alone; adding or removing a
+//   flag re-styles the box in place, and it goes with the last of the two.
 // - "StdPanelTitleChanged" and "pin on"/"pin off" are handled as such only while the panel has
 //   a title box or a pin button; otherwise they reach handleMessageEvent like any message.
 #include <memory>
@@ -47,12 +57,14 @@
 #include "foundation/TabOrderManager.h"
 #include "foundation/rect.h"
 #include "panels/PanelGeometry.h"
-#include "panels/PanelTitleBox.h"
+#include "panels/PanelWidgetList.h"
 #include "panels/WidgetDetails.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/kw/String.h"
 
 class ModalShade;
+class PanelStandardWidgets;
+class PanelTitleTextBox;
 class configb;
 
 class StandardPanel : public rect {
@@ -160,13 +172,12 @@ class StandardPanel : public rect {
   void addStandardWidgets(int flags);
   // Clears the flags and deletes their widgets; `redraw` repaints the panel afterwards.
   void removeStandardWidgets(int flags, bool redraw);
-  int getStandardWidgetFlags() const { return stdFlags_; }
+  int getStandardWidgetFlags() const;
   void positionStandardWidgets();
   // The width left for the title box between the left border and the title buttons.
   int calcMaxTitleWidgetWidth() const;
   // The title box, or null.
-  PanelTitleBox* titleBox() const;
-  static void setTitleBoxFactory(PanelTitleBoxFactory factory);
+  PanelTitleTextBox* titleBox() const;
 
   // --- Size, pinning and modal display ---
   size_state getSizeState() const { return sizeState_; }
@@ -185,45 +196,30 @@ class StandardPanel : public rect {
   Glob* standardWidget(StandardWidgetFlag flag) const;
 
  private:
-  struct StandardWidgets;
-  static constexpr int kTitleMargin = 5;  // from the border to the outermost title widget
-  static constexpr int kTitleGap = 2;     // between neighbouring title widgets
-  static constexpr unsigned short kTitleBoxHeight = 20;
+  static constexpr int kTitleMargin = PanelGeometry::kTitleMargin;
 
   void init();
-  void placeWidget(WidgetDetails& d);
   // The widget's box grown by its surround ring, where it stands now.
   Kw::Box<int> outerBoxOf(const WidgetDetails& d) const;
-  WidgetDetails* findLive(const Glob* widget);
-  const WidgetDetails* findLive(const Glob* widget) const;
-  // A live entry, else the entry of a deleted child that had this address.
-  WidgetDetails* findAny(const Glob* widget);
-  bool ownsCanvasOf(const Glob* widget) const;
-  bool isAncestorOrSelf(const Glob* g) const;
-  bool canAdopt(Glob* widget) const;
-  WidgetDetails& insertDetails(const WidgetDetails& d, Glob* insertAfter);
   // Enters a new widget in the list and the tab order, places it and announces it.
   void adopt(const WidgetDetails& details, Glob* insertAfter);
-  void makeAbsolute(WidgetDetails& d);
   void joinTabOrder(Glob* widget, Glob* insertAfter);
+  // Places the children again and repaints after an edit that changed a rule; false when the
+  // edit was refused.
+  bool relayoutAfter(PanelWidgetList::Edit edit);
   int reactToMessage(Event* e);
   void enterModal();
   void leaveModal();
   void applySizeState(size_state state);
-  void createStandardButtons(int flags);
-  void createTitleBox(int flags);
   // The left edge of the title buttons (less the gap), or the right end of the strip.
   int titleButtonsLeft() const;
-  void syncSizeButton();
-  void syncPinButton();
 
   UifTypeOfBorder border_ = UifBorderNone;
-  int stdFlags_ = 0;
-  std::vector<WidgetDetails> widgets_;
+  PanelWidgetList widgets_{*this};
   XY<int> minSize_;
   WString title_;
   TabOrderManager tabOrder_;
-  std::unique_ptr<StandardWidgets> std_;
+  std::unique_ptr<PanelStandardWidgets> std_;
 
   // Size.
   size_state sizeState_ = SizeFull;
@@ -237,4 +233,5 @@ class StandardPanel : public rect {
   bool savedPinActive_ = true;
   GlobHandle<> modalPin_;
   GlobHandle<ModalShade> shade_;
+  GlobHandle<> modalScreen_;  // the screen whose input the panel holds while modal
 };

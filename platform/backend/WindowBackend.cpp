@@ -165,8 +165,9 @@ void WindowBackend::apply(const TranslatedInput& in) {
 }
 
 void WindowBackend::deliverComposedText(const String& utf8) {
-  Glob* focus = root_->focus();
-  if (!focus) return;
+  // Typed text goes where keys go, so never past an input scope; nowhere without a focus.
+  Glob* focus = root_->keyTarget();
+  if (focus == root_.get()) return;
   Event e(kEventMessage);
   e.message(kMsgCompoundTextInput);
   e.setPayload(utf8);

@@ -93,9 +93,7 @@ void RootGlob::injectKey(int type, unsigned keyCode) {
   Event e(type);
   e.word2 = keyCode;
   e.screenPos = pointer_;
-  Glob* target = focus_.get();
-  if (!target || !target->canvas()->isMappedToRoot()) target = this;
-  deliver(e, target, true);
+  deliver(e, keyTarget(), true);
 }
 
 int RootGlob::deliver(Event& e, Glob* target, bool bubble) {
@@ -107,6 +105,8 @@ int RootGlob::deliver(Event& e, Glob* target, bool bubble) {
     if (result != 0 || !bubble) return result;
     // The handler may have deleted its Glob; then the event stops here.
     if (!h.alive()) return 0;
+    // Nothing leaves the input scope (read again: the handler may have changed it).
+    if (target == inputScope()) return 0;
     Glob* up = target->parent();
     if (up && mouse_event(&e)) {
       const Kw::Box<int>& r = target->canvas()->rect();
@@ -116,6 +116,78 @@ int RootGlob::deliver(Event& e, Glob* target, bool bubble) {
     h = GlobHandle<>(target);
   }
   return 0;
+}
+
+// --- Placing Globs on the screen ---
+
+bool RootGlob::adopt(Glob* g, XY<int> at) {
+  if (!is_good_glob_ptr(g) || g->canvas()->isRoot() || g->canvas()->parent()) return false;
+  g->canvas()->reparent(canvas());
+  const Kw::Box<int>& r = g->canvas()->rect();
+  g->translate_canvas(at.x - r.x0, at.y - r.y0);
+  // Globs made off-screen could not sign up for ticks; the screen takes them on now.
+  std::vector<Glob*> pending{g};
+  while (!pending.empty()) {
+    Glob* x = pending.back();
+    pending.pop_back();
+    if (x->interest() & kInterestTicks) addTicker(x);
+    for (Glob* c : x->children()) pending.push_back(c);
+  }
+  return true;
+}
+
+bool RootGlob::followScreenSize(Glob* g) {
+  if (!is_good_glob_ptr(g) || g->parent() != this) return false;
+  for (const auto& h : screenSized_) {
+    if (h.refersTo(g) && h.alive()) return true;
+  }
+  screenSized_.emplace_back(g);
+  return true;
+}
+
+void RootGlob::reshape() {
+  std::erase_if(screenSized_, [this](const GlobHandle<>& h) {
+    Glob* g = h.get();
+    return !g || g->parent() != this;
+  });
+  // A copy: a Glob's reshape may sign up others, or delete some.
+  const std::vector<GlobHandle<>> now = screenSized_;
+  for (const auto& h : now) {
+    if (Glob* g = h.get()) g->reshape_canvas(0, 0, width(), height());
+  }
+}
+
+// --- Input scopes ---
+
+bool RootGlob::addInputScope(Glob* g) {
+  if (!is_good_glob_ptr(g) || g->root() != this) return false;
+  for (const auto& h : inputScopes_) {
+    if (h.refersTo(g) && h.alive()) return false;
+  }
+  inputScopes_.emplace_back(g);
+  return true;
+}
+
+void RootGlob::removeInputScope(Glob* g) {
+  std::erase_if(inputScopes_, [g](const GlobHandle<>& h) { return h.refersTo(g) || !h.alive(); });
+}
+
+Glob* RootGlob::inputScope() const {
+  for (auto it = inputScopes_.rbegin(); it != inputScopes_.rend(); ++it) {
+    Glob* g = it->get();
+    if (g && g->root() == this) return g;
+  }
+  return nullptr;
+}
+
+Glob* RootGlob::keyTarget() const {
+  Glob* target = focus_.get();
+  if (!target || !target->canvas()->isMappedToRoot()) target = nullptr;
+  if (Glob* scope = inputScope();
+      scope && (!target || !isInside(target->canvas(), scope->canvas()))) {
+    return scope;
+  }
+  return target ? target : const_cast<RootGlob*>(this);
 }
 
 // --- Queue ---

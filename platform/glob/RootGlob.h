@@ -25,6 +25,27 @@ class RootGlob : public Glob, public CanvasHost {
   // `type` is kEventKeyPress or kEventKeyRelease; `keyCode` carries its modifier bits.
   void injectKey(int type, unsigned keyCode);
 
+  // --- Placing Globs on the screen ---
+  // Puts an unattached Glob on this screen with its bottom-left corner at `at`, above the
+  // others; its Globs that asked for ticks get them from now on. False, with nothing changed,
+  // for a null or deleted Glob, a screen, or a Glob that has a parent.
+  bool adopt(Glob* g, XY<int> at);
+  // Keeps `g`, a child of this screen, covering the whole screen whenever the screen changes
+  // size, for as long as it lives. False for anything but a child of this screen.
+  bool followScreenSize(Glob* g);
+
+  // --- Input scopes ---
+  // While a scope is set, input stays inside it: keys whose focus lies outside the scope go
+  // to the scope itself, and input that nothing consumes stops bubbling at the scope. Scopes
+  // nest: the newest live one applies, and removing it brings back the one before. False
+  // when `g` is not on this screen or is a scope already.
+  bool addInputScope(Glob* g);
+  void removeInputScope(Glob* g);
+  Glob* inputScope() const;
+  // Where a key (or typed text) goes now: the focus, or the scope when the focus lies
+  // outside it; the screen itself when there is neither.
+  Glob* keyTarget() const;
+
   // --- Queued delivery ---
   void post(const Event& e);
   // Delivers queued events in order, including ones queued meanwhile, up to `limit`.
@@ -78,6 +99,7 @@ class RootGlob : public Glob, public CanvasHost {
   PaintSession* activePaintSession() const override { return painting_; }
 
   const char* idstring() const override { return "root"; }
+  void reshape() override;
 
  private:
   void updateHover(Glob* under);
@@ -100,4 +122,6 @@ class RootGlob : public Glob, public CanvasHost {
   DirtyRegion dirty_;
   PaintSession* painting_ = nullptr;
   std::function<void(Glob*)> drawObserver_;
+  std::vector<GlobHandle<>> inputScopes_;  // oldest first
+  std::vector<GlobHandle<>> screenSized_;
 };

@@ -12,7 +12,6 @@
 #include "gallery/MessageLog.h"
 #include "platform/backend/HeadlessBackend.h"
 #include "platform/glob/RootGlob.h"
-#include "text/PanelTitleTextBox.h"
 
 namespace {
 
@@ -24,7 +23,6 @@ struct Page {
 };
 
 std::vector<Page> renderEveryPage(const Palette& palette) {
-  PanelTitleTextBox::install();
   HeadlessBackend screen(kWidth, kHeight);
   screen.root().setPalette(palette);
   MessageLog log;

@@ -8,6 +8,7 @@
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
 #include "tests/panels/PanelTestSupport.h"
+#include "text/PanelTitleTextBox.h"
 
 namespace {
 
@@ -39,7 +40,7 @@ TEST_F(PanelBehaviour, MessageTableCallsTheHandlers) {
   EXPECT_EQ(sender->say("poot"), 0);
 
   // Any message starting "minify" flips the size, and is consumed.
-  panel->addStandardWidgets(StdTitleBox);
+  panel->addStandardWidgets(StdSettingsButton);
   EXPECT_EQ(sender->say("minify"), 1);
   EXPECT_EQ(panel->getSizeState(), SizeMinimised);
   EXPECT_EQ(sender->say("minify now"), 1);
@@ -242,48 +243,78 @@ TEST_F(PanelBehaviour, AChildDeletedBehindThePanelsBackLeavesEverythingSafe) {
   EXPECT_TRUE(capture.lines().empty());
 }
 
-TEST_F(PanelBehaviour, TitleBoxSeamCarriesTheTitleBothWays) {
-  struct FakeBox : PanelTitleBox {
-    explicit FakeBox(Glob* g) : box(g) {}
-    Glob* glob() override { return box.get(); }
-    WString text() const override { return shown; }
-    void setText(const WString& t) override { shown = t; }
-    GlobHandle<> box;
-    WString shown;
-  };
-  bool editable = false;
-  FakeBox* made = nullptr;
-  StandardPanel::setTitleBoxFactory([&](StandardPanel& p, unsigned short w, unsigned short ht,
-                                        bool edit) -> std::unique_ptr<PanelTitleBox> {
-    editable = edit;
-    auto box = std::make_unique<FakeBox>(new Glob(GlobCreationInfo(w, ht, p.canvas())));
-    box->shown = p.getTitleW();
-    made = box.get();
-    return box;
-  });
+TEST_F(PanelBehaviour, TheTitleBoxCarriesTheTitleBothWays) {
   panel->setTitle(L"Levels");
   panel->addStandardWidgets(StdEditableTitleBox);
-  ASSERT_NE(panel->titleBox(), nullptr);
-  EXPECT_TRUE(editable);
-  EXPECT_EQ(made->shown, L"Levels");
-  Glob* boxGlob = made->glob();
-  EXPECT_EQ(boxGlob->canvas()->rect(), Kw::Box<int>(5, 97, 195, 117));
+  PanelTitleTextBox* box = panel->titleBox();
+  ASSERT_NE(box, nullptr);
+  EXPECT_EQ(box->getText(), L"Levels");
+  EXPECT_EQ(box->canvas()->rect(), Kw::Box<int>(5, 97, 195, 117));
+  EXPECT_EQ(panel->standardWidget(StdTitleBox), box);
 
-  panel->addStandardWidgets(StdTitleBox);  // a title box is there already
-  EXPECT_EQ(panel->titleBox(), made);
+  h.clickOn(*box);
+  h.key(kKeyEnd);
+  h.type(L" 2");
+  h.key(kKeyReturn);
+  h.pump();
+  EXPECT_EQ(panel->getTitleW(), L"Levels 2");
+  EXPECT_EQ(panel->calls.back(), "title:Levels 2");
+  const size_t calls = panel->calls.size();
+  panel->setTitle(L"Scopes");  // shown, and not echoed back as an edit
+  h.pump();
+  EXPECT_EQ(box->getText(), L"Scopes");
+  EXPECT_EQ(panel->calls.size(), calls);
+}
 
-  made->shown = L"Meters";
-  EXPECT_EQ(sender->say(StandardPanel::titleChangedMsg), 1);
-  EXPECT_EQ(panel->getTitleW(), L"Meters");
-  EXPECT_EQ(panel->calls.back(), "title:Meters");
-  panel->setTitle(L"Scopes");
-  EXPECT_EQ(made->shown, L"Scopes");
-
-  GlobHandle<> watch(boxGlob);
-  panel->removeStandardWidgets(StdEditableTitleBox, true);
-  EXPECT_TRUE(watch.alive());  // the read-only flag still wants it
-  panel->removeStandardWidgets(StdTitleBox, true);
-  EXPECT_FALSE(watch.alive());
-  EXPECT_EQ(panel->titleBox(), nullptr);
-  StandardPanel::setTitleBoxFactory(nullptr);
+// 0x20 alone asks for a read-only box, 0x40 (alone or with 0x20) for an editable one, neither
+// for none, whatever the order in which the flags come and go.
+TEST_F(PanelBehaviour, TitleFlagsInAnyOrderGiveTheBoxTheRemainingFlagAsksFor) {
+  enum Want { None, ReadOnly, Editable };
+  struct Step {
+    bool add;
+    int flags;
+    Want want;
+  };
+  const std::vector<std::vector<Step>> sequences = {
+      {{true, StdTitleBox, ReadOnly},
+       {true, StdEditableTitleBox, Editable},
+       {false, StdEditableTitleBox, ReadOnly},
+       {false, StdTitleBox, None}},
+      {{true, StdEditableTitleBox, Editable},
+       {true, StdTitleBox, Editable},
+       {false, StdEditableTitleBox, ReadOnly},
+       {true, StdEditableTitleBox, Editable},
+       {false, StdTitleBox, Editable},
+       {false, StdEditableTitleBox, None}},
+      {{true, StdTitleBox | StdEditableTitleBox, Editable},
+       {false, StdTitleBox | StdEditableTitleBox, None}},
+      {{true, StdEditableTitleBox, Editable}, {false, StdTitleBox, Editable}},
+  };
+  int n = 0;
+  for (const auto& steps : sequences) {
+    SCOPED_TRACE(n++);
+    auto* p = new RecordingPanel(GlobCreationInfo(200, 120, probe->canvas(), 10, 10));
+    p->setTitle(L"T");
+    for (const Step& s : steps) {
+      if (s.add) {
+        p->addStandardWidgets(s.flags);
+      } else {
+        p->removeStandardWidgets(s.flags, true);
+      }
+      PanelTitleTextBox* box = p->titleBox();
+      ASSERT_EQ(box != nullptr, s.want != None);
+      if (!box) continue;
+      // Typed into as a user would: only an editable box renames the panel.
+      p->setTitle(L"T");
+      h.advance(500);  // no click here is the second of a pair
+      h.clickOn(*box);
+      h.key(kKeyEnd);
+      h.type(L"x");
+      h.key(kKeyReturn);
+      h.pump();
+      EXPECT_EQ(p->getTitleW(), s.want == Editable ? L"Tx" : L"T");
+      EXPECT_EQ(box->isEditable(), s.want == Editable);
+    }
+    delete p;
+  }
 }

@@ -199,7 +199,9 @@ TEST(PanelConstruction, FromAConfigurationRecord) {
   EXPECT_EQ(a.canvas()->rect(), Box(12, 0, 332, 90));
   EXPECT_EQ(a.getBorderStyle(), UifBorderFramed);
   EXPECT_EQ(a.getTitleW(), L"Mixer");
-  EXPECT_EQ(a.parent(), nullptr);  // no canvas given: unattached
+  EXPECT_EQ(a.root(), nullptr);  // no canvas given: on no screen until it is put on one
+  ASSERT_TRUE(h.root().adopt(&a, XY<int>(12, 0)));
+  EXPECT_EQ(a.parent(), &h.root());
 
   // Bad values fall back to the defaults given, with a report.
   Diagnostics::Capture capture;

@@ -194,12 +194,10 @@ TEST_F(TextBoxFixture, VeryLongTextsPasteSelectAndUndo) {
 }
 
 TEST_F(TextBoxFixture, AnEditablePanelTitleBoxRenamesThePanel) {
-  PanelTitleTextBox::install();
   auto* panel = new StandardPanel(h.place(0, 0, 300, 120));
   panel->setTitle(L"Old title");
   panel->addStandardWidgets(StdEditableTitleBox);
-  Glob* glob = panel->titleBox() ? panel->titleBox()->glob() : nullptr;
-  auto* title = dynamic_cast<TextBox*>(glob);
+  PanelTitleTextBox* title = panel->titleBox();
   ASSERT_NE(title, nullptr);
   EXPECT_EQ(title->height(), 20);
   EXPECT_TRUE(title->isEditable());
@@ -215,8 +213,6 @@ TEST_F(TextBoxFixture, AnEditablePanelTitleBoxRenamesThePanel) {
 
   auto* plain = new StandardPanel(h.place(0, 0, 300, 120));
   plain->addStandardWidgets(StdTitleBox);
-  auto* readOnly = dynamic_cast<TextBox*>(plain->titleBox()->glob());
-  ASSERT_NE(readOnly, nullptr);
-  EXPECT_FALSE(readOnly->isEditable());
-  StandardPanel::setTitleBoxFactory(nullptr);
+  ASSERT_NE(plain->titleBox(), nullptr);
+  EXPECT_FALSE(plain->titleBox()->isEditable());
 }
