@@ -1,6 +1,7 @@
 #include "panels/ModalShade.h"
 
 #include "platform/glib/Painter.h"
+#include "platform/glib/look/PanelLook.h"
 
 ModalShade::ModalShade(Glob& screen, const Colour& colour)
     : Glob(GlobCreationInfo(screen.width(), screen.height(), screen.canvas())), colour_(colour) {}
@@ -12,5 +13,5 @@ int ModalShade::react(Event* e) {
 
 void ModalShade::draw() {
   Glib::Painter p(*canvas());
-  p.fillRect(p.bounds(), colour_);
+  Glib::PanelLook::modalShade(p, colour_);
 }

@@ -8,6 +8,7 @@
 #include "buttons/PinButton.h"
 #include "panels/ModalShade.h"
 #include "panels/PanelStandardWidgets.h"
+#include "platform/glib/look/PanelLook.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/misc/Config.h"
 #include "platform/misc/Diagnostics.h"
@@ -18,8 +19,6 @@ const char* const StandardPanel::doItMsg = "do_it";
 const char* const StandardPanel::titleChangedMsg = "StdPanelTitleChanged";
 
 namespace {
-
-constexpr int kShadeAlpha8 = 150;  // how much of the screen the modal shade hides, of 255
 
 GlobCreationInfo makeInfo(unsigned short width, unsigned short height, const Palette* palette,
                           Canvas* parent) {
@@ -439,9 +438,7 @@ void StandardPanel::enterModal() {
   }
   setDismissable(false);
   if (RootGlob* screen = root(); screen && static_cast<Glob*>(screen) != this) {
-    Colour shade = getPalette().windowShade(0);
-    shade.a = kShadeAlpha8 / 255.0;
-    shade_ = new ModalShade(*screen, shade);
+    shade_ = new ModalShade(*screen, Glib::PanelLook(getPalette()).modalShadeColour());
     screen->followScreenSize(shade_.get());
     // The shade is now on top of the screen; lift this panel's top-level ancestor above it.
     Glob* top = this;
