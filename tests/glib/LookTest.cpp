@@ -1,13 +1,11 @@
-// The look layer: the panel recipes draw exactly what panels draw today, the two palettes keep
-// their text readable, and a tree takes the palette of its root.
+// The look layer: the two palettes keep their text readable, and a tree takes the palette of
+// its root.
 #include <gtest/gtest.h>
 
 #include <cmath>
-#include <functional>
 
 #include "buttons/Button.h"
 #include "buttons/Checkbox.h"
-#include "panels/ModalShade.h"
 #include "panels/StandardPanel.h"
 #include "platform/glib/Painter.h"
 #include "platform/glib/look/PanelLook.h"
@@ -17,75 +15,6 @@
 namespace {
 
 using Glib::PanelLook;
-
-// A panel drawn by the look's recipes alone, as panels will call them.
-class RecipePanel : public StandardPanel {
- public:
-  using StandardPanel::StandardPanel;
-
-  void drawBackground() override {
-    Glib::Painter p(*canvas());
-    if (!p.active()) return;
-    const PanelFrame f = frame();
-    const Kw::Box<int> title = PanelGeometry::titleStrip(f);
-    const int margin = 5;  // from the border to the title
-    const int textLeft = calcBorderSize(getBorderStyle()) + margin;
-    const Kw::Box<int> textBox(title.x0 + margin, title.y0 + 1,
-                               textLeft + calcMaxTitleWidgetWidth(), title.y1);
-    PanelLook(getPalette())
-        .background(p, getcol(), title, titleBox() ? WString() : getTitleW(), textBox,
-                    PanelGeometry::bottomStrip(f));
-  }
-  void drawBorder() override {
-    Glib::Painter p(*canvas());
-    if (!p.active()) return;
-    PanelLook(getPalette()).border(p, static_cast<PanelLook::Frame>(getBorderStyle()));
-  }
-  void drawWidgets() override {
-    Glib::Painter p(*canvas());
-    if (!p.active()) return;
-    for (unsigned i = 0; i < numWidgets(); ++i) {
-      const WidgetDetails* d = getWidget(i);
-      if (d->surround == SurroundNone || !d->get() || !d->get()->isVisible()) continue;
-      const int s = PanelGeometry::surroundWidth(d->surround);
-      const Kw::Box<int>& r = d->get()->canvas()->rect();
-      PanelLook(getPalette())
-          .surround(p, Kw::Box<int>(r.x0 - s, r.y0 - s, r.x1 + s, r.y1 + s),
-                    static_cast<PanelLook::Surround>(d->surround), s);
-    }
-  }
-};
-
-constexpr int kW = 200, kH = 110;
-
-// Builds the same panel as a StandardPanel and as a RecipePanel and counts the pixels in which
-// the two renderings differ.
-int differingPixels(const std::function<void(StandardPanel&)>& setUp, const Palette& palette) {
-  Harness a(kW, kH), b(kW, kH);
-  a.root().setPalette(palette);
-  b.root().setPalette(palette);
-  StandardPanel original(a.place(0, 0, kW, kH));
-  RecipePanel recipes(b.place(0, 0, kW, kH));
-  setUp(original);
-  setUp(recipes);
-  a.render();
-  b.render();
-  int differ = 0;
-  for (int y = 0; y < kH; ++y)
-    for (int x = 0; x < kW; ++x) differ += a.pixelAt(x, y) != b.pixelAt(x, y);
-  return differ;
-}
-
-void withSurroundedChildren(StandardPanel& panel) {
-  const WidgetSurround surrounds[] = {SurroundRaised, SurroundSunken, SurroundFramed};
-  int x = 8;
-  for (WidgetSurround s : surrounds) {
-    auto* child = new StandardPanel(GlobCreationInfo(24, 14, panel.canvas()));
-    child->setcol(panel.getPalette().get(Palette::Base), false);
-    panel.addWidget(child, XY<int>(x, 8), OriginInnerBottomLeft, s);
-    x += 40;
-  }
-}
 
 double luminance(const Colour& c) {
   auto lin = [](double v) { return v <= 0.03928 ? v / 12.92 : std::pow((v + 0.055) / 1.055, 2.4); };
@@ -102,43 +31,6 @@ double pixelLuminance(uint32_t argb) {
 }
 
 }  // namespace
-
-TEST(PanelLook, RecipesDrawWhatPanelsDraw) {
-  for (const Palette& palette : {Palette::dark(), Palette::light()}) {
-    for (UifTypeOfBorder border :
-         {UifBorderNone, UifBorderRaised, UifBorderFramed, UifBorderSunken}) {
-      EXPECT_EQ(differingPixels(
-                    [border](StandardPanel& panel) {
-                      panel.setBorderStyle(border);
-                      withSurroundedChildren(panel);
-                    },
-                    palette),
-                0)
-          << "border " << border;
-    }
-    // Title strip with its text beside a close button, and the bottom strip of the OK button.
-    EXPECT_EQ(differingPixels(
-                  [](StandardPanel& panel) {
-                    panel.setBorderStyle(UifBorderRaised);
-                    panel.setTitle(L"Channel strip");
-                    panel.addStandardWidgets(StdPootButton | StdDoItButton);
-                  },
-                  palette),
-              0);
-  }
-}
-
-TEST(PanelLook, ModalShadeIsTheOneThePanelLays) {
-  Harness h(200, 150);
-  h.root().setPalette(Palette::light());
-  StandardPanel* panel = new StandardPanel(h.place(20, 20, 120, 80));
-  panel->setModal(true);
-  auto* shade = dynamic_cast<ModalShade*>(panel->modalShade());
-  ASSERT_NE(shade, nullptr);
-  EXPECT_EQ(shade->colour(), PanelLook(panel->getPalette()).modalShadeColour());
-  panel->setModal(false);
-  delete panel;
-}
 
 TEST(Palette, DefaultIsTheDarkLookAndLightDiffersInEveryRole) {
   EXPECT_EQ(Palette(), Palette::dark());
