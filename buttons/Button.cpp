@@ -79,24 +79,14 @@ Button& Button::operator=(const Button& other) {
 Button::~Button() = default;
 
 void Button::init() {
-  downLabel.clear();
-  upIcon.clear();
-  downIcon.clear();
-  style = kButtonStyleBevelled;
+  settings_.reset();
   state = kButtonUp;
-  bevelWidth = 4;
-  textAlignment = TextAlignment::Centred;
-  latching = 0;
-  pressure = 0;
-  brightening = 1;
-  ignoreMouseClicks = 0;
-  textStyle = Glib::TextStyles::Normal;
-  reporter_.clearModifiers();
-  repeatInterval = 0;
-  repeatDelay = 0;
+  tracking_ = false;
+  ignoreMouseClicks = false;
   firstRepeat = false;
   lastRepeatTime = 0;
   mouseInside = false;
+  reporter_.clearModifiers();
   const Palette& p = getPalette();
   upForeCol = downForeCol = p.get(Palette::ButtonText);
   upBackCol = downBackCol = p.get(Palette::Button);
@@ -108,32 +98,32 @@ void Button::post_init() {
   ensure_canvas_is_mapped();
 }
 
+// Through the setters, so that the record's values are checked as any setting is; values at
+// their defaults change nothing and the button keeps sharing the default record.
 void Button::applySettings(const ButtonInitArgs& args) {
-  downLabel = args.downLabel;
-  set_latching(args.latching, args.latchingOption);
-  set_pressure_button(args.pressure ? 1 : 0);
-  set_repeating(args.repeatRate, args.repeatDelay);
+  const ButtonSettings& s = args.settings;
+  setDownString(s.downLabel);
+  set_up_icon(s.upIcon.c_str());
+  set_down_icon(s.downIcon.c_str());
+  set_style(s.style);
+  set_bevel_width(s.bevelWidth);
+  setTextAlignment(s.textAlignment);
+  set_latching(s.latching != kNotLatching, s.latching == kLatchingWithLamp);
+  set_pressure_button(s.pressure ? 1 : 0);
+  set_brightening(s.brightening);
+  setTextStyle(s.textStyle);
+  if (args.repeatRate > 0) {
+    set_repeating(args.repeatRate, args.repeatDelay);
+  } else if (s.repeatInterval > 0) {
+    settings_.edit().repeatInterval = s.repeatInterval;
+    settings_.edit().repeatDelay = std::max(0, s.repeatDelay);
+  }
   set_ignore_mouse_clicks(args.ignoreMouseClicks ? 1 : 0);
-  setTextAlignment(args.textAlignment);
-  setTextStyle(args.textStyle);
-  set_style(args.style);
-  set_bevel_width(args.bevelWidth);
 }
 
 void Button::copySettingsFrom(const Button& other) {
   label = other.label;
-  downLabel = other.downLabel;
-  upIcon = other.upIcon;
-  downIcon = other.downIcon;
-  style = other.style;
-  bevelWidth = other.bevelWidth;
-  textAlignment = other.textAlignment;
-  latching = other.latching;
-  pressure = other.pressure != 0 ? 1 : 0;
-  brightening = other.brightening;
-  textStyle = other.textStyle;
-  repeatInterval = other.repeatInterval;
-  repeatDelay = other.repeatDelay;
+  settings_ = other.settings_;
   upForeCol = other.upForeCol;
   downForeCol = other.downForeCol;
   upBackCol = other.upBackCol;
@@ -161,7 +151,7 @@ void Button::set_state(button_state newState, bool redraw) {
   }
   const bool changed = newState != state;
   state = newState;
-  if (state == kButtonDown && repeatInterval >= 1) {
+  if (state == kButtonDown && settings_->repeatInterval >= 1) {
     lastRepeatTime = clock();
     firstRepeat = true;
   }
@@ -175,7 +165,7 @@ void Button::switch_state(button_state newState, bool silent) {
                 ", nothing reported\n");
     return;
   }
-  if (latching != 0) {
+  if (settings_->latching != kNotLatching) {
     set_state(newState, true);
     if (!silent)
       informParent(get_message() +
@@ -184,7 +174,7 @@ void Button::switch_state(button_state newState, bool silent) {
   }
   if (!silent) {
     GlobHandle<Button> self(this);
-    if (pressure != 0) {
+    if (settings_->pressure) {
       informParent(get_message() +
                    (state == kButtonUp ? pressureBtnDownSuffix_ : pressureBtnUpSuffix_));
     } else {
@@ -218,7 +208,7 @@ void Button::informParent(const String& msg) {
 // left button, then keys and messages.
 int Button::react(Event* e) {
   if (!e) return 0;
-  if (pressure == -1) return reactWhileTracking(e);
+  if (tracking_) return reactWhileTracking(e);
   if (tick_event(e)) return reactToTick();
   if (mouse_left_event(e) && !ignoreMouseClicks) {
     if (mouse_down_event(e)) return reactToPress(e);
@@ -244,8 +234,8 @@ int Button::reactWhileTracking(Event* e) {
   if (mouse_up_event(e)) {
     switch_state(kButtonUp, false);
     if (!self) return 1;
-    pressure = 1;
-    if (repeatInterval != 0) clear_interest(kInterestTicks);
+    tracking_ = false;
+    if (settings_->repeatInterval != 0) clear_interest(kInterestTicks);
     return 1;
   }
   if (mouse_move_event(e)) {
@@ -255,7 +245,7 @@ int Button::reactWhileTracking(Event* e) {
     if (length > dragThreshold_) {
       informParent(get_message() + pressureBtnDragSuffix_);
       if (!self) return 1;
-      pressure = 1;
+      tracking_ = false;
       set_state(kButtonUp, true);
     }
   }
@@ -267,9 +257,9 @@ int Button::reactToTick() {
     clear_interest(kInterestTicks);
     return 1;
   }
-  if (repeatInterval > 0 && state == kButtonDown) {
+  if (settings_->repeatInterval > 0 && state == kButtonDown) {
     const int now = clock();
-    const int wait = firstRepeat ? repeatDelay : repeatInterval;
+    const int wait = firstRepeat ? settings_->repeatDelay : settings_->repeatInterval;
     if (now - lastRepeatTime > wait) {
       firstRepeat = false;
       lastRepeatTime = now;
@@ -288,14 +278,14 @@ int Button::reactToPress(Event*) {
   if (!self) return 1;
   // Made inactive by a receiver: no press to track and nothing to repeat.
   if (!isActive()) return 1;
-  if (pressure != 0) pressure = -1;
-  if (repeatInterval != 0) set_interest(kInterestTicks);
+  if (settings_->pressure) tracking_ = true;
+  if (settings_->repeatInterval != 0) set_interest(kInterestTicks);
   return 1;
 }
 
 int Button::reactToRelease(Event* e) {
-  if (latching == 0) set_state(kButtonUp, true);
-  if (repeatInterval != 0) clear_interest(kInterestTicks);
+  if (settings_->latching == kNotLatching) set_state(kButtonUp, true);
+  if (settings_->repeatInterval != 0) clear_interest(kInterestTicks);
   return rect::react(e);
 }
 
@@ -324,13 +314,13 @@ void Button::handle_kbd_focus() {
 void Button::setActive(bool active, bool redraw) {
   if (active == isActive()) return;
   if (!active) {
-    if (latching == 0 && state == kButtonDown) set_state(kButtonUp, redraw);
-    if (pressure == -1) pressure = 1;
-    if (repeatInterval != 0) clear_interest(kInterestTicks);
+    if (settings_->latching == kNotLatching && state == kButtonDown) set_state(kButtonUp, redraw);
+    tracking_ = false;
+    if (settings_->repeatInterval != 0) clear_interest(kInterestTicks);
     if (glib_getCurrentMouseCanvas(this) == canvas()) handleMouseContainment(false);
   }
   rect::setActive(active, false);
-  ignoreMouseClicks = active ? 0 : 1;
+  ignoreMouseClicks = !active;
   if (redraw) update();
 }
 
@@ -346,7 +336,7 @@ void Button::handleMouseContainment(bool inside) {
 }
 
 String Button::describeValue() const {
-  return label.empty() ? upIcon : Kw::toUtf8(label);
+  return label.empty() ? settings_->upIcon : Kw::toUtf8(label);
 }
 
 void Button::setNewWidgetValue(WString& value) {
@@ -357,38 +347,39 @@ void Button::setNewWidgetValue(WString& value) {
 // --- Settings ---
 
 void Button::setDownString(const WString& s) {
-  if (s == downLabel) return;
-  downLabel = s;
+  if (s == settings_->downLabel) return;
+  settings_.edit().downLabel = s;
   update();
 }
 
 void Button::set_up_icon(const char* name) {
-  if (!name || !*name || upIcon == name) return;
-  upIcon = name;
+  if (!name || !*name || settings_->upIcon == name) return;
+  settings_.edit().upIcon = name;
   update();
 }
 
 void Button::set_down_icon(const char* name) {
-  if (!name || !*name || downIcon == name) return;
-  downIcon = name;
+  if (!name || !*name || settings_->downIcon == name) return;
+  settings_.edit().downIcon = name;
   update();
 }
 
 void Button::set_latching(bool latch, bool option) {
-  const int mode = latch ? (option ? 2 : 1) : 0;
-  if (mode == latching) return;
-  latching = mode;
+  const button_latching mode = latch ? (option ? kLatchingWithLamp : kLatching) : kNotLatching;
+  if (mode == settings_->latching) return;
+  settings_.edit().latching = mode;
   update();
 }
 
 void Button::set_pressure_button(int on) {
-  if ((pressure != 0) == (on != 0)) return;
-  pressure = on != 0 ? 1 : 0;
+  if (settings_->pressure == (on != 0)) return;
+  settings_.edit().pressure = on != 0;
+  if (on == 0) tracking_ = false;
 }
 
 void Button::set_repeating(int rate, double delay) {
   if (rate <= 0) {
-    repeatInterval = 0;
+    if (settings_->repeatInterval != 0) settings_.edit().repeatInterval = 0;
     return;
   }
   if (!std::isfinite(delay) || delay < 0.0) {
@@ -397,33 +388,33 @@ void Button::set_repeating(int rate, double delay) {
   }
   // Both halvings are deliberate.
   const double delayMs = std::trunc(delay * 0.5 * 1000.0);
-  repeatDelay = delayMs >= INT_MAX ? INT_MAX : static_cast<int>(delayMs);
+  ButtonSettings& s = settings_.edit();
+  s.repeatDelay = delayMs >= INT_MAX ? INT_MAX : static_cast<int>(delayMs);
   // A rate above 1000 per second would give no interval at all: the fastest repeat is kept.
-  repeatInterval = std::max(1, (1000 / rate) / 2);
+  s.repeatInterval = std::max(1, (1000 / rate) / 2);
 }
 
 void Button::set_ignore_mouse_clicks(int ignore) {
-  const int v = ignore != 0 ? 1 : 0;
-  if (v == ignoreMouseClicks) return;
-  ignoreMouseClicks = v;
+  if ((ignore != 0) == ignoreMouseClicks) return;
+  ignoreMouseClicks = ignore != 0;
   update();
 }
 
 void Button::set_style(button_style s) {
-  if (s == style) return;
-  style = s;
+  if (s == settings_->style) return;
+  settings_.edit().style = s;
   update();
 }
 
 void Button::set_bevel_width(int w) {
-  if (w < 0 || w == bevelWidth) return;
-  bevelWidth = w;
+  if (w < 0 || w == settings_->bevelWidth) return;
+  settings_.edit().bevelWidth = w;
   update();
 }
 
 void Button::set_brightening(int b) {
-  if (b == brightening) return;
-  brightening = b;
+  if (b == settings_->brightening) return;
+  settings_.edit().brightening = b;
   update();
 }
 
@@ -433,14 +424,15 @@ void Button::set_ranged_left(int left) {
 
 void Button::setTextAlignment(TextAlignment a) {
   const int v = static_cast<int>(a);
-  if (v < 0 || v > 2 || a == textAlignment) return;
-  textAlignment = a;
+  if (v < 0 || v > 2 || a == settings_->textAlignment) return;
+  settings_.edit().textAlignment = a;
   update();
 }
 
 void Button::setTextStyle(Glib::TextStyles::TextStyle s) {
-  if (s < Glib::TextStyles::Plain || s > Glib::TextStyles::Shadowed || s == textStyle) return;
-  textStyle = s;
+  if (s < Glib::TextStyles::Plain || s > Glib::TextStyles::Shadowed || s == settings_->textStyle)
+    return;
+  settings_.edit().textStyle = s;
   update();
 }
 
@@ -458,7 +450,7 @@ const Colour& Button::get_forecol() const {
 
 Colour Button::get_backcol() const {
   const Colour& c = state == kButtonDown ? downBackCol : upBackCol;
-  if (isActive() && mouseInside && brightening != 0) return Glib::ButtonLook::hovered(c);
+  if (isActive() && mouseInside && settings_->brightening != 0) return Glib::ButtonLook::hovered(c);
   return c;
 }
 
@@ -512,14 +504,14 @@ WString displayText(const WString& s) {
 }  // namespace
 
 Kw::Box<int> Button::contentBox() const {
-  const int inset = style == kButtonStyleFlat ? 1 : bevelWidth;
+  const int inset = settings_->style == kButtonStyleFlat ? 1 : settings_->bevelWidth;
   const int w = width(), h = height();
   const int ix = std::min(inset, w / 2), iy = std::min(inset, h / 2);
   return Kw::Box<int>(ix, iy, w - ix, h - iy);
 }
 
 const WString& Button::shownLabel() const {
-  return state == kButtonDown && !downLabel.empty() ? downLabel : label;
+  return state == kButtonDown && !settings_->downLabel.empty() ? settings_->downLabel : label;
 }
 
 Kw::Box<int> Button::symbolBox() const {
@@ -528,7 +520,7 @@ Kw::Box<int> Button::symbolBox() const {
   return Glib::ButtonLook::pressed(
       Kw::Box<int>::fromSize(c.x0 + (c.width() - side) / 2, c.y0 + (c.height() - side) / 2, side,
                              side),
-      state == kButtonDown, style == kButtonStyleFlat);
+      state == kButtonDown, settings_->style == kButtonStyleFlat);
 }
 
 Colour Button::faceColour() const {
@@ -550,17 +542,17 @@ void Button::drawBackground() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   Glib::ButtonLook(getPalette())
-      .background(p, faceColour(), state == kButtonDown, style == kButtonStyleFlat);
+      .background(p, faceColour(), state == kButtonDown, settings_->style == kButtonStyleFlat);
 }
 
 void Button::drawEdge() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   const Glib::ButtonLook look(getPalette());
-  look.edge(p, edgeColour(), faceColour(), state == kButtonDown, style == kButtonStyleFlat,
-            isActive(), bevelWidth);
+  look.edge(p, edgeColour(), faceColour(), state == kButtonDown,
+            settings_->style == kButtonStyleFlat, isActive(), settings_->bevelWidth);
   const Kw::Box<int> content = contentBox();
-  if (latching == 2 && state == kButtonDown) look.latchLamp(p, content);
+  if (settings_->latching == kLatchingWithLamp && state == kButtonDown) look.latchLamp(p, content);
   if (hasKeyboardFocus()) look.focusMark(p, content);
 }
 
@@ -569,24 +561,29 @@ void Button::drawText() {
   if (!p.active()) return;
   const int w = width(), h = height();
   // Labels may use the bevel's height (small buttons) but keep clear of its sides.
-  const int side = std::min(w / 2, (style == kButtonStyleFlat ? 1 : bevelWidth) + 2);
-  Kw::Box<int> box = Glib::ButtonLook::pressed(Kw::Box<int>(side, 1, w - side, h - 1),
-                                               state == kButtonDown, style == kButtonStyleFlat);
+  const int side =
+      std::min(w / 2, (settings_->style == kButtonStyleFlat ? 1 : settings_->bevelWidth) + 2);
+  Kw::Box<int> box =
+      Glib::ButtonLook::pressed(Kw::Box<int>(side, 1, w - side, h - 1), state == kButtonDown,
+                                settings_->style == kButtonStyleFlat);
   const WString text = displayText(shownLabel());
 
-  const String& icon = state == kButtonDown && !downIcon.empty() ? downIcon : upIcon;
+  const String& icon = state == kButtonDown && !settings_->downIcon.empty() ? settings_->downIcon
+                                                                            : settings_->upIcon;
   if (!icon.empty()) {
     const Kw::Ptr<Glib::Image> img = Glib::Image::load(imageSearchPath().resolve(icon));
     if (img) box.x0 = drawIcon(p, *img, text.empty()) + 4;
   }
   if (text.empty() || box.empty()) return;
-  p.text(text, box, *Glib::fonts().standard(), labelColour(), textAlignment, textStyle);
+  p.text(text, box, *Glib::fonts().standard(), labelColour(), settings_->textAlignment,
+         settings_->textStyle);
 }
 
 int Button::drawIcon(Glib::Painter& p, const Glib::Image& img, bool alone) {
   return Glib::ButtonLook::picture(
       p, img, contentBox(), p.bounds(), alone,
-      Glib::ButtonLook::pressShift(state == kButtonDown, style == kButtonStyleFlat), isActive());
+      Glib::ButtonLook::pressShift(state == kButtonDown, settings_->style == kButtonStyleFlat),
+      isActive());
 }
 
 Colour Button::edgeColour() {

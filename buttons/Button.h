@@ -37,6 +37,7 @@
 #include <cstdint>
 #include <functional>
 
+#include "buttons/ButtonSettings.h"
 #include "foundation/ButtonWidget.h"
 #include "foundation/GlobTabStop.h"
 #include "foundation/MessageReporter.h"
@@ -45,30 +46,21 @@
 #include "platform/glib/TextAlignment.h"
 #include "platform/glib/TextStyles.h"
 #include "platform/glib/look/ButtonLook.h"
-
-enum button_state : int { kButtonUp = 0, kButtonDown = 1 };
-
-enum button_style : int { kButtonStyleFlat = 0, kButtonStyleBevelled = 1 };
+#include "platform/kw/SharedRecord.h"
 
 // The callback of the older interface: paints over the face box for the given state.
 using ButtonProcedure = std::function<void(const Kw::Box<int>& face, button_state state)>;
 
-// Everything a button is made from: where it goes (the creation record, palette included) and
-// its settings.
+// Everything a button is made from: where it goes (the creation record, palette included), its
+// label and message, and its settings. The repeat is given as set_repeating takes it: reports
+// per second and a delay in seconds (a rate of 0 or less for none).
 struct ButtonInitArgs : GlobCreationInfo {
   WString label;
-  WString downLabel;
   String message;
-  bool latching = false;
-  bool latchingOption = false;
-  bool pressure = false;
-  int repeatRate = 0;  // reports per second while held; 0 for none
+  ButtonSettings settings;
+  int repeatRate = 0;
   double repeatDelay = 0.0;
   bool ignoreMouseClicks = false;
-  TextAlignment textAlignment = TextAlignment::Centred;
-  Glib::TextStyles::TextStyle textStyle = Glib::TextStyles::Normal;
-  button_style style = kButtonStyleBevelled;
-  int bevelWidth = 4;
 
   ButtonInitArgs() = default;
   ButtonInitArgs(const WString& l, const String& msg, const GlobCreationInfo& where)
@@ -134,40 +126,43 @@ class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
   // --- Settings ---
   const WString& getString() const { return label; }
   void setDownString(const WString& s);
-  const WString& getDownString() const { return downLabel; }
+  const WString& getDownString() const { return settings_->downLabel; }
   void set_up_icon(const char* name);
   void set_down_icon(const char* name);
-  const String& get_up_icon() const { return upIcon; }
-  const String& get_down_icon() const { return downIcon; }
+  const String& get_up_icon() const { return settings_->upIcon; }
+  const String& get_down_icon() const { return settings_->downIcon; }
 
   void set_latching(bool latch, bool option = false);
-  bool get_latching() const { return latching != 0; }
-  int getLatchingMode() const { return latching; }
+  bool get_latching() const { return settings_->latching != kNotLatching; }
+  button_latching getLatchingMode() const { return settings_->latching; }
   void set_pressure_button(int on);
-  int get_pressure() const { return pressure; }
+  button_pressure get_pressure() const {
+    return tracking_ ? kPressureTracking : settings_->pressure ? kPressureOn : kPressureOff;
+  }
   // `rate` reports per second while held, starting `delay` seconds after the press; both are
   // halved (the ticks of the older timer ran at twice the rate). A rate of 0 or less stops
   // repeating.
   void set_repeating(int rate, double delay);
-  int getRepeatInterval() const { return repeatInterval; }
-  int getRepeatDelay() const { return repeatDelay; }
+  int getRepeatInterval() const { return settings_->repeatInterval; }
+  int getRepeatDelay() const { return settings_->repeatDelay; }
 
   void set_ignore_mouse_clicks(int ignore);
-  int get_ignore_mouse_clicks() const { return ignoreMouseClicks; }
+  int get_ignore_mouse_clicks() const { return ignoreMouseClicks ? 1 : 0; }
 
   void set_style(button_style s);
-  button_style get_style() const { return style; }
+  button_style get_style() const { return settings_->style; }
   button_state get_state() const { return state; }
-  int get_bevel_width() const { return bevelWidth; }
+  int get_bevel_width() const { return settings_->bevelWidth; }
   // Negative widths are refused.
   void set_bevel_width(int w);
-  int get_brightening() const { return brightening; }
+  int get_brightening() const { return settings_->brightening; }
   void set_brightening(int b);
   void set_ranged_left(int left);
   void setTextAlignment(TextAlignment a);
-  TextAlignment getTextAlignment() const { return textAlignment; }
+  TextAlignment getTextAlignment() const { return settings_->textAlignment; }
   void setTextStyle(Glib::TextStyles::TextStyle s);
-  Glib::TextStyles::TextStyle getTextStyle() const { return textStyle; }
+  Glib::TextStyles::TextStyle getTextStyle() const { return settings_->textStyle; }
+  const ButtonSettings& settings() const { return *settings_; }
   void set_procedure(ButtonProcedure procedure) { procedure_ = std::move(procedure); }
   bool isMouseInside() const { return mouseInside; }
 
@@ -219,23 +214,13 @@ class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
   bool sendCentreEvent(int type);
 
   WString label;
-  WString downLabel;
-  String upIcon;
-  String downIcon;
-  button_style style = kButtonStyleBevelled;
+  Kw::SharedRecord<ButtonSettings> settings_;
   button_state state = kButtonUp;
-  int bevelWidth = 4;
-  TextAlignment textAlignment = TextAlignment::Centred;
-  int latching = 0;
-  int pressure = 0;
-  int brightening = 1;
-  int ignoreMouseClicks = 0;
-  Glib::TextStyles::TextStyle textStyle = Glib::TextStyles::Normal;
-  int repeatInterval = 0;
-  int repeatDelay = 0;
+  bool tracking_ = false;  // a pressure press is being tracked
+  bool ignoreMouseClicks = false;
   bool firstRepeat = false;
-  int lastRepeatTime = 0;
   bool mouseInside = false;
+  int lastRepeatTime = 0;
   Colour upForeCol;
   Colour downForeCol;
   Colour upBackCol;

@@ -84,15 +84,15 @@ void buildImageButtons(GalleryPage& page, int top) {
   page.addCard("IMAGE BUTTONS", x0, top, 360, 184);
   const int row1 = top + 44, row2 = row1 + kButtonH + 14;
 
-  ImageButtonInitArgs settings(L"settings.png", L"settings.png", "settings",
-                               page.place(x0 + kGap, row1, 120, kButtonH));
-  settings.label = L"Settings";
-  settings.textAlignment = TextAlignment::Left;
-  named(new ImageButton(settings), "Settings");
+  ImageButtonInitArgs gear(L"settings.png", L"settings.png", "settings",
+                           page.place(x0 + kGap, row1, 120, kButtonH));
+  gear.label = L"Settings";
+  gear.settings.textAlignment = TextAlignment::Left;
+  named(new ImageButton(gear), "Settings");
 
   ImageButtonInitArgs pin(L"pin.png", L"pinned.png", "pin",
                           page.place(x0 + kGap + 136, row1, 32, kButtonH));
-  pin.latching = true;
+  pin.settings.latching = kLatching;
   named(new ImageButton(pin), "Pin");
 
   const XY<int> natural = ImageButton::naturalSize(L"settings.png", L"");

@@ -355,10 +355,10 @@ TEST_F(ButtonTest, ColoursComeFromThePaletteAndBadSettingsAreRefused) {
 
 TEST_F(ButtonTest, InitArgsApplySettingsAndPalette) {
   ButtonInitArgs args(L"Go", "go", GlobCreationInfo(50, 20, parent.canvas(), 5, 5));
-  args.latching = true;
+  args.settings.latching = kLatching;
   args.repeatRate = 10;
   args.repeatDelay = 0.4;
-  args.textAlignment = TextAlignment::Right;
+  args.settings.textAlignment = TextAlignment::Right;
   args.palette.set(Palette::Focus, Colour(1, 0, 1));
   Button* b = new Button(args);
   EXPECT_TRUE(b->get_latching());
@@ -390,6 +390,18 @@ TEST_F(ButtonTest, CopiesTakeSettingsButNotState) {
   *c = *a;
   EXPECT_EQ(c->get_message(), "a");
   EXPECT_EQ(c->canvas()->rect().x0, 200);
+
+  // Copies share the settings until one of them changes: the others keep theirs.
+  c->set_bevel_width(7);
+  c->setDownString(L"Other");
+  EXPECT_EQ(a->get_bevel_width(), 4);
+  EXPECT_EQ(b->getDownString(), L"Down");
+  EXPECT_EQ(c->getLatchingMode(), kLatching);
+  // A button made with default settings holds the shared defaults until it is changed.
+  Button* plain = make("p", 20, 100);
+  EXPECT_EQ(plain->settings(), ButtonSettings{});
+  plain->set_style(kButtonStyleFlat);
+  EXPECT_EQ(make("q", 100, 100)->get_style(), kButtonStyleBevelled);
 }
 
 TEST_F(ButtonTest, AdaptorHearsClicksAndMessages) {
