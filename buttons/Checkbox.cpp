@@ -63,56 +63,34 @@ Checkbox::~Checkbox() = default;
 
 void Checkbox::init(bool initialTicked) {
   ticked = initialTicked;
-  msgPrefix = kDefaultPrefix;
-  appendState = true;
-  msgGeneration = GenerateOnPress;
+  settings_.reset();
   clicksEnabled = true;
   userFunction = nullptr;
   userData = nullptr;
   textColourWhenTicked = getPalette().get(Palette::WindowText);
   textColour = getPalette().get(Palette::WindowText);
-  appearance = BoxLeft;
-  borderStyle = getBorderStyle();
-  textAlignment = TextAlignment::Left;
-  margin = kDefaultMargin;
-  boldWhenTicked = false;
-  brighten = true;
-  tickCharacter = 0;
   mouseInside = false;
+  if (getBorderStyle() != UifBorderNone) settings_.edit().borderStyle = getBorderStyle();
   setcol(backgroundFrom(*this), false);
   setDefaultCursor(kCursorHand);
 }
 
 void Checkbox::applyArgs(const CheckboxInitArgs& args) {
-  label = args.label;
-  msgPrefix = args.msgPrefix;
-  appendState = args.appendState;
-  msgGeneration = args.msgGeneration == GenerateOnRelease ? GenerateOnRelease : GenerateOnPress;
-  if (args.appearance >= BoxLeft && args.appearance <= FlatToggle)
-    appearance = static_cast<Appearance>(args.appearance);
-  setBorderStyle(args.borderStyle);
-  textAlignment = args.textAlignment;
-  if (args.bold) font.style = Glib::FontDesc::Bold;
-  boldWhenTicked = args.boldWhenTicked;
+  Settings s = args.settings;
+  // Numbers outside the enumerations fall back to the defaults.
+  if (s.msgGeneration != GenerateOnRelease) s.msgGeneration = GenerateOnPress;
+  if (s.appearance < BoxLeft || s.appearance > FlatToggle) s.appearance = BoxLeft;
+  if (!(s == *settings_)) settings_.edit() = s;
+  StandardPanel::setBorderStyle(s.borderStyle);
   clicksEnabled = args.clicksEnabled;
 }
 
 void Checkbox::copySettingsFrom(const Checkbox& other) {
-  label = other.label;
-  font = other.font;
-  msgPrefix = other.msgPrefix;
-  appendState = other.appendState;
-  msgGeneration = other.msgGeneration;
+  settings_ = other.settings_;
+  StandardPanel::setBorderStyle(settings_->borderStyle);
   clicksEnabled = other.clicksEnabled;
   textColourWhenTicked = other.textColourWhenTicked;
   textColour = other.textColour;
-  appearance = other.appearance;
-  setBorderStyle(other.borderStyle);
-  textAlignment = other.textAlignment;
-  margin = other.margin;
-  boldWhenTicked = other.boldWhenTicked;
-  brighten = other.brighten;
-  tickCharacter = other.tickCharacter;
   setcol(other.getcol(), false);
   setActive(other.isActive(), false);
 }
@@ -122,8 +100,8 @@ Checkbox* Checkbox::make(unsigned short width, unsigned short height, const WStr
   auto* box = new Checkbox(width, height, tick, 0, parent);
   box->setLabel(text);
   box->setcol(colour, false);
-  if (flag1) box->font.style = Glib::FontDesc::Bold;
-  if (flag2) box->appearance = FlatToggle;
+  if (flag1) box->settings_.edit().font.style = Glib::FontDesc::Bold;
+  if (flag2) box->settings_.edit().appearance = FlatToggle;
   return box;
 }
 
@@ -184,12 +162,12 @@ void Checkbox::requestToggleState() {
       return;
     }
   }
-  sendToggleMessage(appendState);
+  sendToggleMessage(settings_->appendState);
 }
 
 String Checkbox::toggleMessage(bool withState) const {
-  if (!withState) return msgPrefix;
-  return msgPrefix + (ticked ? kTickedWord : kClearWord);
+  if (!withState) return settings_->msgPrefix;
+  return settings_->msgPrefix + (ticked ? kTickedWord : kClearWord);
 }
 
 bool Checkbox::sendToggleMessage(bool withState) {
@@ -200,8 +178,18 @@ bool Checkbox::sendToggleMessage(bool withState) {
 }
 
 void Checkbox::setMsgPrefix(const String& prefix, bool append) {
-  msgPrefix = prefix;
-  appendState = append;
+  if (prefix == settings_->msgPrefix && append == settings_->appendState) return;
+  Settings& s = settings_.edit();
+  s.msgPrefix = prefix;
+  s.appendState = append;
+}
+
+void Checkbox::setMessageGeneration(eMsgGeneration generation) {
+  if (generation != settings_->msgGeneration) settings_.edit().msgGeneration = generation;
+}
+
+void Checkbox::setBrighten(bool b) {
+  if (b != settings_->brighten) settings_.edit().brighten = b;
 }
 
 void Checkbox::setUserFunction(UserFunction fn, void* data) {
@@ -225,8 +213,8 @@ int Checkbox::react(Event* e) {
 int Checkbox::reactToLeftButton(Event* e) {
   const bool press = mouse_down_event(e);
   const bool release = mouse_up_event(e);
-  if ((msgGeneration == GenerateOnPress && press) ||
-      (msgGeneration == GenerateOnRelease && release)) {
+  if ((settings_->msgGeneration == GenerateOnPress && press) ||
+      (settings_->msgGeneration == GenerateOnRelease && release)) {
     requestToggleState();
   }
   return 1;
@@ -248,25 +236,25 @@ void Checkbox::handleMouseContainment(bool inside) {
 }
 
 void Checkbox::setBorderStyle(UifTypeOfBorder border) {
-  borderStyle = border;
+  if (border != settings_->borderStyle) settings_.edit().borderStyle = border;
   StandardPanel::setBorderStyle(border);
 }
 
 String Checkbox::describeValue() const {
-  return Kw::toUtf8(label) + (ticked ? " [ticked]" : " [clear]");
+  return Kw::toUtf8(settings_->label) + (ticked ? " [ticked]" : " [clear]");
 }
 
 // --- Look ---
 
 void Checkbox::setLabel(const WString& text) {
-  if (text == label) return;
-  label = text;
+  if (text == settings_->label) return;
+  settings_.edit().label = text;
   update();
 }
 
 void Checkbox::setFont(const Glib::FontDesc& desc) {
-  if (desc == font) return;
-  font = desc;
+  if (desc == settings_->font) return;
+  settings_.edit().font = desc;
   update();
 }
 
@@ -283,32 +271,32 @@ void Checkbox::setTextColour(const Colour& c) {
 }
 
 void Checkbox::setAppearance(Appearance a) {
-  if (a == appearance || a < BoxLeft || a > FlatToggle) return;
-  appearance = a;
+  if (a == settings_->appearance || a < BoxLeft || a > FlatToggle) return;
+  settings_.edit().appearance = a;
   update();
 }
 
 void Checkbox::setTextAlignment(TextAlignment a) {
-  if (a == textAlignment) return;
-  textAlignment = a;
+  if (a == settings_->textAlignment) return;
+  settings_.edit().textAlignment = a;
   update();
 }
 
 void Checkbox::setMargin(uint16_t m) {
-  if (m == margin) return;
-  margin = m;
+  if (m == settings_->margin) return;
+  settings_.edit().margin = m;
   update();
 }
 
 void Checkbox::setBoldWhenTicked(bool b) {
-  if (b == boldWhenTicked) return;
-  boldWhenTicked = b;
+  if (b == settings_->boldWhenTicked) return;
+  settings_.edit().boldWhenTicked = b;
   if (ticked) update();
 }
 
 void Checkbox::setTickCharacter(char c) {
-  if (c == tickCharacter) return;
-  tickCharacter = c;
+  if (c == settings_->tickCharacter) return;
+  settings_.edit().tickCharacter = c;
   if (ticked) update();
 }
 
@@ -323,21 +311,23 @@ Colour Checkbox::getTextColour() {
 // --- Layout ---
 
 Kw::Box<int> Checkbox::indicatorBox() const {
-  const int b = calcBorderSize(borderStyle);
+  const int b = calcBorderSize(settings_->borderStyle);
   const Kw::Box<int> inner(b, b, width() - b, height() - b);
-  const int iw = indicatorWidth(appearance);
-  const int ih = std::min(appearance == FlatToggle ? kToggleHeight : kBoxSize, inner.height());
+  const int iw = indicatorWidth(settings_->appearance);
+  const int ih =
+      std::min(settings_->appearance == FlatToggle ? kToggleHeight : kBoxSize, inner.height());
   const int y0 = inner.y0 + (inner.height() - ih) / 2;
-  const int x0 = appearance == BoxRight ? inner.x1 - margin - iw : inner.x0 + margin;
+  const int x0 = settings_->appearance == BoxRight ? inner.x1 - settings_->margin - iw
+                                                   : inner.x0 + settings_->margin;
   return Kw::Box<int>(x0, y0, x0 + iw, y0 + ih);
 }
 
 Kw::Box<int> Checkbox::labelBox() const {
-  const int b = calcBorderSize(borderStyle);
+  const int b = calcBorderSize(settings_->borderStyle);
   const Kw::Box<int> ind = indicatorBox();
-  if (appearance == BoxRight)
-    return Kw::Box<int>(b + margin + 1, b, ind.x0 - kLabelGap, height() - b);
-  return Kw::Box<int>(ind.x1 + kLabelGap, b, width() - b - margin, height() - b);
+  if (settings_->appearance == BoxRight)
+    return Kw::Box<int>(b + settings_->margin + 1, b, ind.x0 - kLabelGap, height() - b);
+  return Kw::Box<int>(ind.x1 + kLabelGap, b, width() - b - settings_->margin, height() - b);
 }
 
 // --- Drawing ---
@@ -361,13 +351,13 @@ void Checkbox::paintIndicatorWell() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   Glib::MarkLook(getPalette())
-      .well(p, indicatorBox(), getcol(), mouseInside && isActive() && brighten, isActive(),
-            appearance == FlatToggle);
+      .well(p, indicatorBox(), getcol(), mouseInside && isActive() && settings_->brighten,
+            isActive(), settings_->appearance == FlatToggle);
 }
 
 void Checkbox::drawTickBox() {
   paintIndicatorWell();
-  if (appearance != FlatToggle || ticked) return;
+  if (settings_->appearance != FlatToggle || ticked) return;
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   Glib::MarkLook(getPalette()).switchOff(p, indicatorBox(), isActive());
@@ -379,22 +369,22 @@ void Checkbox::drawTick(bool full) {
   if (!p.active()) return;
   const Glib::MarkLook look(getPalette());
   const Kw::Box<int> box = indicatorBox();
-  if (appearance == FlatToggle) {
+  if (settings_->appearance == FlatToggle) {
     if (full) {
       look.switchOn(p, box, isActive());
     } else {
       look.switchMixed(p, box, getcol(), isActive());
     }
   } else if (full) {
-    look.tick(p, box, tickCharacter, isActive());
+    look.tick(p, box, settings_->tickCharacter, isActive());
   } else {
     look.mixedBar(p, box, isActive());
   }
 }
 
 Glib::FontDesc Checkbox::labelFont() const {
-  Glib::FontDesc desc = font;
-  if (boldWhenTicked && ticked) desc.style = Glib::FontDesc::Bold;
+  Glib::FontDesc desc = settings_->font;
+  if (settings_->boldWhenTicked && ticked) desc.style = Glib::FontDesc::Bold;
   return desc;
 }
 
@@ -402,17 +392,18 @@ void Checkbox::drawLabel() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   const Kw::Box<int> box = labelBox();
-  if (!label.empty() && !box.empty()) {
-    p.text(label, box, *Glib::fonts().get(labelFont()), getTextColour(), textAlignment,
-           Glib::TextStyles::Plain);
+  if (!settings_->label.empty() && !box.empty()) {
+    p.text(settings_->label, box, *Glib::fonts().get(labelFont()), getTextColour(),
+           settings_->textAlignment, Glib::TextStyles::Plain);
   }
   if (hasKeyboardFocus()) {
     const Kw::Box<int> ind = indicatorBox();
     // Round the indicator and the label's text, not the whole label box.
     Kw::Box<int> text = box;
-    if (!label.empty() && textAlignment == TextAlignment::Left)
-      text.x1 = std::min(box.x1, box.x0 + Glib::fonts().get(labelFont())->textWidth(label) + 2);
-    const Kw::Box<int> mark = label.empty()
+    if (!settings_->label.empty() && settings_->textAlignment == TextAlignment::Left)
+      text.x1 = std::min(box.x1,
+                         box.x0 + Glib::fonts().get(labelFont())->textWidth(settings_->label) + 2);
+    const Kw::Box<int> mark = settings_->label.empty()
                                   ? inset(ind, -2, -2)
                                   : Kw::Box<int>(std::min(ind.x0, text.x0) - 2, ind.y0 - 2,
                                                  std::max(ind.x1, text.x1) + 1, ind.y1 + 2);

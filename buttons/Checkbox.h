@@ -36,27 +36,11 @@
 #include "panels/StandardPanel.h"
 #include "platform/glib/FontDesc.h"
 #include "platform/glib/TextAlignment.h"
+#include "platform/kw/SharedRecord.h"
 
 class Checkbox;
 
-// Everything a check box is made from: where it goes and its settings.
-struct CheckboxInitArgs : GlobCreationInfo {
-  WString label;
-  bool ticked = false;
-  String msgPrefix = "Checkbox ";
-  bool appendState = true;
-  int msgGeneration = 0;  // Checkbox::eMsgGeneration
-  int appearance = 0;     // Checkbox::Appearance
-  UifTypeOfBorder borderStyle = UifBorderNone;
-  TextAlignment textAlignment = TextAlignment::Left;
-  bool bold = false;
-  bool boldWhenTicked = false;
-  bool clicksEnabled = true;
-
-  CheckboxInitArgs() = default;
-  CheckboxInitArgs(const WString& l, bool tick, const GlobCreationInfo& where)
-      : GlobCreationInfo(where), label(l), ticked(tick) {}
-};
+struct CheckboxInitArgs;
 
 class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabStop {
  public:
@@ -74,6 +58,26 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
   static constexpr int kToggleWidth = 26;  // the flat switch's track
   static constexpr int kToggleHeight = 14;
   static constexpr int kLabelGap = 5;  // between the indicator and the label
+
+  // Everything about a box that is a setting rather than state, with its defaults, written
+  // once: boxes left at the defaults share one record, CheckboxInitArgs carries one and copies
+  // take it whole. The colours are not here: their defaults come from the palette.
+  struct Settings {
+    WString label;
+    Glib::FontDesc font;
+    String msgPrefix = kDefaultPrefix;
+    bool appendState = true;
+    eMsgGeneration msgGeneration = GenerateOnPress;
+    Appearance appearance = BoxLeft;
+    UifTypeOfBorder borderStyle = UifBorderNone;
+    TextAlignment textAlignment = TextAlignment::Left;
+    uint16_t margin = kDefaultMargin;
+    bool boldWhenTicked = false;
+    bool brighten = true;  // the box lightens under the pointer
+    char tickCharacter = 0;
+
+    bool operator==(const Settings&) const = default;
+  };
 
   Checkbox(unsigned short width, unsigned short height, bool ticked, int flag, Canvas* parent);
   Checkbox(const GlobCreationInfo& info, bool ticked);
@@ -124,15 +128,15 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
 
   // --- Reporting ---
   void setMsgPrefix(const String& prefix, bool appendState = true);
-  const String& getMsgPrefix() const { return msgPrefix; }
-  bool getAppendState() const { return appendState; }
+  const String& getMsgPrefix() const { return settings_->msgPrefix; }
+  bool getAppendState() const { return settings_->appendState; }
   // The prefix, then the state word when `withState`.
   String toggleMessage(bool withState) const;
   // Sends toggleMessage(withState) to the parent as a message event; false with no parent.
   // The receiver runs before this returns and may delete the box.
   bool sendToggleMessage(bool withState);
-  void setMessageGeneration(eMsgGeneration generation) { msgGeneration = generation; }
-  eMsgGeneration getMessageGeneration() const { return msgGeneration; }
+  void setMessageGeneration(eMsgGeneration generation);
+  eMsgGeneration getMessageGeneration() const { return settings_->msgGeneration; }
   void setClicksEnabled(bool enabled) { clicksEnabled = enabled; }
   bool getClicksEnabled() const { return clicksEnabled; }
   void setUserFunction(UserFunction fn, void* data);
@@ -141,24 +145,25 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
 
   // --- Look ---
   void setLabel(const WString& text);
-  const WString& getLabel() const { return label; }
+  const WString& getLabel() const { return settings_->label; }
   void setFont(const Glib::FontDesc& desc);
-  const Glib::FontDesc& getFont() const { return font; }
+  const Glib::FontDesc& getFont() const { return settings_->font; }
   void setTextColourWhenTicked(const Colour& c);
   const Colour& getTextColourWhenTicked() const { return textColourWhenTicked; }
   void setTextColour(const Colour& c);
   void setAppearance(Appearance a);
-  Appearance getAppearance() const { return appearance; }
+  Appearance getAppearance() const { return settings_->appearance; }
   void setTextAlignment(TextAlignment a);
-  TextAlignment getTextAlignment() const { return textAlignment; }
+  TextAlignment getTextAlignment() const { return settings_->textAlignment; }
   void setMargin(uint16_t m);
-  uint16_t getMargin() const { return margin; }
+  uint16_t getMargin() const { return settings_->margin; }
   void setBoldWhenTicked(bool b);
-  bool getBoldWhenTicked() const { return boldWhenTicked; }
+  bool getBoldWhenTicked() const { return settings_->boldWhenTicked; }
   // Whether the box lightens under the pointer.
-  void setBrighten(bool b) { brighten = b; }
+  void setBrighten(bool b);
   void setTickCharacter(char c);
-  char getTickCharacter() const { return tickCharacter; }
+  char getTickCharacter() const { return settings_->tickCharacter; }
+  const Settings& settings() const { return *settings_; }
   bool isMouseInside() const { return mouseInside; }
 
   // Where the indicator (tick box or switch track) and the label go, in the box's coordinates.
@@ -182,22 +187,25 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
   static int indicatorWidth(Appearance a);
 
   bool ticked = false;
-  String msgPrefix;
-  bool appendState = true;
-  eMsgGeneration msgGeneration = GenerateOnPress;
-  bool clicksEnabled = true;
+  Kw::SharedRecord<Settings> settings_;
+  bool clicksEnabled = true;  // changes with the box's part in a radio row, so kept apart
   UserFunction userFunction = nullptr;
   void* userData = nullptr;
   Colour textColourWhenTicked;
   Colour textColour;
-  Appearance appearance = BoxLeft;
-  UifTypeOfBorder borderStyle = UifBorderNone;
-  TextAlignment textAlignment = TextAlignment::Left;
-  uint16_t margin = kDefaultMargin;
-  bool boldWhenTicked = false;
-  bool brighten = true;
-  char tickCharacter = 0;
   bool mouseInside = false;
-  WString label;
-  Glib::FontDesc font;
+};
+
+// Everything a check box is made from: where it goes, whether it starts ticked, and its
+// settings.
+struct CheckboxInitArgs : GlobCreationInfo {
+  bool ticked = false;
+  Checkbox::Settings settings;
+  bool clicksEnabled = true;
+
+  CheckboxInitArgs() = default;
+  CheckboxInitArgs(const WString& label, bool tick, const GlobCreationInfo& where)
+      : GlobCreationInfo(where), ticked(tick) {
+    settings.label = label;
+  }
 };

@@ -323,11 +323,11 @@ TEST_F(BoxFixture, TriStateIsDisplayOnly) {
 
 TEST_F(BoxFixture, InitArgsAndCopiesCarryTheSettingsButNotTheUserFunction) {
   CheckboxInitArgs args(L"Solo", true, GlobCreationInfo(120, 20, panel.canvas(), 10, 10));
-  args.msgPrefix = "solo ";
-  args.msgGeneration = Checkbox::GenerateOnRelease;
-  args.appearance = Checkbox::BoxRight;
-  args.borderStyle = UifBorderRaised;
-  args.bold = true;
+  args.settings.msgPrefix = "solo ";
+  args.settings.msgGeneration = Checkbox::GenerateOnRelease;
+  args.settings.appearance = Checkbox::BoxRight;
+  args.settings.borderStyle = UifBorderRaised;
+  args.settings.font.style = Glib::FontDesc::Bold;
   auto* box = new Checkbox(args);
   EXPECT_TRUE(box->getState());
   EXPECT_EQ(box->getLabel(), L"Solo");
@@ -346,4 +346,17 @@ TEST_F(BoxFixture, InitArgsAndCopiesCarryTheSettingsButNotTheUserFunction) {
   EXPECT_EQ(copy->getUserFunction(), nullptr);
   copy->requestToggleState();
   EXPECT_EQ(panel.texts(), std::vector<String>{"solo CLEAR"});
+
+  // The copy's settings are its own once changed; the original keeps its own.
+  copy->setMsgPrefix("copy ");
+  copy->setLabel(L"Copy");
+  EXPECT_EQ(box->getMsgPrefix(), "solo ");
+  EXPECT_EQ(box->getLabel(), L"Solo");
+  // Out-of-range numbers in the record fall back to the defaults.
+  CheckboxInitArgs odd(L"Odd", false, GlobCreationInfo(120, 20, panel.canvas(), 10, 40));
+  odd.settings.appearance = static_cast<Checkbox::Appearance>(7);
+  odd.settings.msgGeneration = static_cast<Checkbox::eMsgGeneration>(-3);
+  auto* oddBox = new Checkbox(odd);
+  EXPECT_EQ(oddBox->getAppearance(), Checkbox::BoxLeft);
+  EXPECT_EQ(oddBox->getMessageGeneration(), Checkbox::GenerateOnPress);
 }
