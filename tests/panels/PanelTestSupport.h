@@ -73,3 +73,13 @@ class RecordingPanel : public StandardPanel {
   bool pootPassesOn = false;
   int messageAnswer = 0;
 };
+
+// A Glob that swallows every event and counts the presses that reach it.
+struct PressCounter : Glob {
+  using Glob::Glob;
+  int react(Event* e) override {
+    if (mouse_down_event(e)) ++downs;
+    return 1;
+  }
+  int downs = 0;
+};

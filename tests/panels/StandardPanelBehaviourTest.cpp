@@ -164,14 +164,7 @@ TEST_F(PanelBehaviour, ModalNestingAndTheShade) {
 }
 
 TEST_F(PanelBehaviour, ModalShadeStopsClicksReachingWhatLiesBeneath) {
-  struct Counter : Glob {
-    using Glob::Glob;
-    int react(Event* e) override {
-      if (mouse_down_event(e)) ++downs;
-      return 1;
-    }
-    int downs = 0;
-  } under(h.place(450, 200, 100, 100));
+  PressCounter under(h.place(450, 200, 100, 100));
 
   h.click(XY<int>(500, 250));
   EXPECT_EQ(under.downs, 1);

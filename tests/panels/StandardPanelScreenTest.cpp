@@ -143,21 +143,13 @@ TEST_F(ModalInput, NestedLevelsHoldInputUntilTheLastOneGoes) {
 }
 
 TEST_F(ModalInput, TheShadeFollowsTheScreenThroughAResize) {
-  struct Counter : Glob {
-    using Glob::Glob;
-    int react(Event* e) override {
-      if (mouse_down_event(e)) ++downs;
-      return 1;
-    }
-    int downs = 0;
-  };
   dialog->setModal(true);
   h.root().reshape_canvas(0, 0, 900, 700);
   Glob* shade = dialog->modalShade();
   ASSERT_NE(shade, nullptr);
   EXPECT_EQ(shade->canvas()->rect(), Box(0, 0, 900, 700));
   // A Glob beneath the shade, in the part of the screen the resize added.
-  auto* late = new Counter(h.place(800, 600, 50, 50));
+  auto* late = new PressCounter(h.place(800, 600, 50, 50));
   late->push_to_bottom();
   h.click(XY<int>(820, 620));
   EXPECT_EQ(late->downs, 0);
