@@ -34,9 +34,10 @@ void ValueBoxLook::thermometer(Painter& p, const Kw::Box<int>& inside, int width
 }
 
 void ValueBoxLook::grip(Painter& p, const Kw::Box<int>& box, bool dragging, bool active) const {
-  const Colour ridge = !active    ? palette_.get(Palette::Disabled)
-                       : dragging ? palette_.get(Palette::Caret)
-                                  : palette_.get(Palette::Light);
+  const Colour ridge =
+      !active    ? palette_.get(Palette::Disabled)
+      : dragging ? palette_.get(Palette::Caret)
+                 : mix(palette_.get(Palette::Base), palette_.get(Palette::Text), kRidgeStrength);
   const int cx = (box.x0 + box.x1) / 2;
   const int cy = (box.y0 + box.y1) / 2;
   for (int i = -1; i <= 1; ++i) {

@@ -40,6 +40,7 @@ class ValueBoxLook {
   static constexpr double kThermometerStrength = 0.45;  // from the base towards the highlight
   static constexpr double kInactiveFade = 0.5;          // an inactive bar, towards the base
   static constexpr double kEdgeLight = 0.45;
+  static constexpr double kRidgeStrength = 0.4;  // a ridge, from the base towards the text
   static constexpr int kRidgeLength = 6;
   static constexpr int kRidgeGap = 3;
 
