@@ -101,7 +101,8 @@ class TextBoxBase : public StandardPanel, public GlobTabStop {
   const WString& getGhostLabel() const { return ghostLabel_; }
   void setCaretColour(const Colour& colour);
   Colour getCaretColour() const;
-  Colour getTextColour() const;
+  // Virtual so that a box inside another control can show its owner's text colour.
+  virtual Colour getTextColour() const;
   // The current text becomes the unchanged state.
   void clearChanged();
 
