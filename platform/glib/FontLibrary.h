@@ -4,13 +4,14 @@
 // preferred faces, hinting and anti-aliasing rules, the user's configuration file) takes part
 // in resolving them, so text looks the same on every machine.
 //
-//   face asked for                       resolves to
-//   ""                                   kDefaultFontFace (filled in by FontDesc)
-//   sans, sans-serif, system-ui          DejaVu Sans
-//   serif                                DejaVu Serif
+//   face asked for                         resolves to
+//   ""                                     kDefaultFontFace (filled in by FontDesc)
+//   sans, sans-serif, system-ui            DejaVu Sans
+//   serif                                  DejaVu Serif
 //   monospace, mono, courier, courier new  DejaVu Sans Mono (kMonospaceFontFace)
-//   a family of a loaded file            that family (case and blanks ignored)
-//   anything else                        not carried: family() is empty
+//   a family of a loaded file              that family (case ignored)
+//   anything else, or a library face whose file is missing
+//                                          not carried: family() is empty
 //
 // The library's files are the DejaVu Sans, Sans Mono and Serif families in their four styles,
 // read from kFontDir (Debian's fonts-dejavu-core and fonts-dejavu-extra). Characters that none
