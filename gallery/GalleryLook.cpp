@@ -20,7 +20,7 @@ const Glib::iFont& GalleryLook::font(Font f) {
     case Font::Small:
       return get(FontDesc("", 11));
     case Font::Mono:
-      return get(FontDesc("DejaVu Sans Mono", 12));
+      return get(FontDesc(Glib::kMonospaceFontFace, 12));
     case Font::Body:
       break;
   }

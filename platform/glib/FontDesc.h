@@ -12,6 +12,9 @@ namespace Glib {
 // The standard UI face and size in pixels.
 inline constexpr const char* kDefaultFontFace = "DejaVu Sans";
 inline constexpr int kDefaultFontSize = 13;
+// The library's monospaced face (what "courier" and "monospace" mean) and its serif face.
+inline constexpr const char* kMonospaceFontFace = "DejaVu Sans Mono";
+inline constexpr const char* kSerifFontFace = "DejaVu Serif";
 
 struct FontDesc {
   enum Style : int { Plain = 0, Bold = 1, Italic = 2, BoldItalic = 3 };

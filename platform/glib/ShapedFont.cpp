@@ -1,5 +1,7 @@
 #include "platform/glib/ShapedFont.h"
 
+#include <pango/pangofc-font.h>
+
 #include <algorithm>
 
 #include "platform/glib/LayoutCache.h"
@@ -7,14 +9,14 @@
 
 namespace Glib {
 
-ShapedFont::ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts,
-                       GlyphCache& glyphs, int id)
+ShapedFont::ShapedFont(const FontDesc& desc, const String& family, PangoContext* context,
+                       LayoutCache& layouts, GlyphCache& glyphs, int id)
     : iFont(desc),
       context_(static_cast<PangoContext*>(g_object_ref(context))),
       pangoDesc_(pango_font_description_new()),
       layouts_(layouts),
       id_(id) {
-  pango_font_description_set_family(pangoDesc_, desc.face.c_str());
+  pango_font_description_set_family(pangoDesc_, family.c_str());
   pango_font_description_set_absolute_size(pangoDesc_, desc.size * double(PANGO_SCALE));
   pango_font_description_set_weight(pangoDesc_,
                                     desc.bold() ? PANGO_WEIGHT_BOLD : PANGO_WEIGHT_NORMAL);
@@ -38,6 +40,14 @@ ShapedFont::~ShapedFont() {
   if (info_.primary) g_object_unref(info_.primary);
   pango_font_description_free(pangoDesc_);
   g_object_unref(context_);
+}
+
+String ShapedFont::fileName() const {
+  if (!info_.primary || !PANGO_IS_FC_FONT(info_.primary)) return String();
+  FcPattern* pattern = pango_fc_font_get_pattern(PANGO_FC_FONT(info_.primary));
+  FcChar8* file = nullptr;
+  if (!pattern || FcPatternGetString(pattern, FC_FILE, 0, &file) != FcResultMatch) return String();
+  return reinterpret_cast<const char*>(file);
 }
 
 Kw::Ptr<TextLayout> ShapedFont::layout(const WString& text) const {

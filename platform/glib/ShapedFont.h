@@ -14,9 +14,10 @@ class LayoutCache;
 
 class ShapedFont : public iFont {
  public:
-  // `desc` is resolved (face and size filled in). The font keeps a reference on `context`.
-  ShapedFont(const FontDesc& desc, PangoContext* context, LayoutCache& layouts, GlyphCache& glyphs,
-             int id);
+  // `desc` is resolved (face and size filled in); `family` is the name `context` knows its face
+  // by. The font keeps a reference on `context`.
+  ShapedFont(const FontDesc& desc, const String& family, PangoContext* context,
+             LayoutCache& layouts, GlyphCache& glyphs, int id);
   ~ShapedFont() override;
   ShapedFont(const ShapedFont&) = delete;
   ShapedFont& operator=(const ShapedFont&) = delete;
@@ -30,6 +31,8 @@ class ShapedFont : public iFont {
 
   // The shaped text, from the layout cache when it is there.
   Kw::Ptr<TextLayout> layout(const WString& text) const;
+  // The file the face is read from (empty when the font system does not say).
+  String fileName() const;
 
  private:
   PangoContext* context_;

@@ -79,7 +79,7 @@ class TextLayout : public Kw::RefCounted {
     cairo_scaled_font_t* font = nullptr;
     std::vector<cairo_glyph_t> glyphs;
   };
-  // A character no installed font has: drawn as an outlined box.
+  // A character that no face of the font configuration has: drawn as an outlined box.
   struct MissingGlyph {
     double x, width;
   };
