@@ -394,7 +394,7 @@ void Slider::draw() {
   look.groove(p, oriented(start - 1, groove0, end + 2, groove0 + g), isActive());
   if (hasPointOfInterest) {
     const int x = static_cast<int>(std::trunc(v2x(pointOfInterest)));
-    look.pointOfInterest(p, oriented(x - 1, groove0 + g + 1, x + 2, across - 1), isActive());
+    look.pointOfInterest(p, oriented(x - 1, groove0 - 1, x + 2, across - 1), isActive());
   }
   if (thumbVisible) {
     const Kw::Box<short> a = getThumbArea();
