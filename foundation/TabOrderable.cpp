@@ -5,7 +5,7 @@
 #include "foundation/TabOrderManager.h"
 
 TabOrderable::~TabOrderable() {
-  *alive_ = false;
+  if (alive_) *alive_ = false;
   std::vector<TabOrderManager*> from;
   {
     Kw::RWLock::WriteGuard g(lock_);
@@ -24,7 +24,7 @@ bool TabOrderable::isTabStopFocus() const {
 }
 
 void TabOrderable::relinquishTabStopFocus() {
-  const std::shared_ptr<bool> alive = alive_;
+  const std::shared_ptr<bool> alive = aliveFlag();
   for (TabOrderManager* m : getManagers()) {
     // A focus-loss handler may have destroyed this object or a later manager.
     if (!*alive) return;
@@ -33,12 +33,17 @@ void TabOrderable::relinquishTabStopFocus() {
 }
 
 bool TabOrderable::requestTabStopFocus() {
-  const std::shared_ptr<bool> alive = alive_;
+  const std::shared_ptr<bool> alive = aliveFlag();
   for (TabOrderManager* m : getManagers()) {
     if (!*alive) return false;
     if (isRegisteredWith(m)) m->setTabStopFocus(this);
   }
   return *alive && isTabStopFocus();
+}
+
+std::shared_ptr<bool> TabOrderable::aliveFlag() {
+  if (!alive_) alive_ = std::make_shared<bool>(true);
+  return alive_;
 }
 
 void TabOrderable::registerManager(TabOrderManager* m) const {

@@ -44,8 +44,11 @@ class TabOrderable {
   friend class TabOrderManager;
   // A dying manager drops every one of its entries here.
   void forgetManager(TabOrderManager* m) const;
+  // The flag that outlives this object while a handler may destroy it; made on first need, so
+  // that controls built by the thousand cost no allocation for it.
+  std::shared_ptr<bool> aliveFlag();
 
   mutable std::vector<TabOrderManager*> managers_;
   Kw::RWLock lock_{1, 100, 1};
-  std::shared_ptr<bool> alive_ = std::make_shared<bool>(true);
+  std::shared_ptr<bool> alive_;
 };

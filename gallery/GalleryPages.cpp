@@ -12,6 +12,9 @@ const std::vector<GalleryPageEntry>& galleryPages() {
       {"Text", "Single-line text entry, labels, titled text and tooltips.", buildTextPage},
       {"Menus", "Pop-up menus, drop-down buttons and combo boxes.", buildMenusPage},
       {"Values", "Value boxes with their parsers, sliders and scroll bars.", buildValuesPage},
+      {"Sliders & scroll bars",
+       "Sliders with a point of interest, and scroll bars that ask their owner where to go.",
+       buildSlidersPage},
       {"Lists", "Cells addressed by column and row, fed by a data supplier.", buildListsPage},
       {"Panels", "Standard panels, tabbed dialogues and widget groups.", buildPanelsPage},
   };

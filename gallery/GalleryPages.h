@@ -20,5 +20,6 @@ void buildChecksPage(GalleryPage& page);
 void buildTextPage(GalleryPage& page);
 void buildMenusPage(GalleryPage& page);
 void buildValuesPage(GalleryPage& page);
+void buildSlidersPage(GalleryPage& page);
 void buildListsPage(GalleryPage& page);
 void buildPanelsPage(GalleryPage& page);
