@@ -48,7 +48,9 @@ void TextLabel::init(const WString& text, const Glib::FontDesc& font, bool sizeT
   font_ = Glib::fonts().get(fontDesc_);
   text_ = text;
   if (sizeToText) {
-    resizeKeepingTop(neededWidth(text_), font_->height() + kSizeAllowance);
+    // A new label stands where it was created, bottom-left corner first.
+    const Kw::Box<int>& r = canvas()->rect();
+    reshape_canvas(r.x0, r.y0, neededWidth(text_), font_->height() + kSizeAllowance);
   } else {
     growToFit();
   }

@@ -19,7 +19,8 @@
 // - A label measures its text at construction: the explicit forms start exactly as large as
 //   the text needs (its width plus 2 by calcHeight); an init record with a size starts at that
 //   size and grows from there.
-// - Growing keeps the top-left corner where it is (labels read from the top down); a label
+// - A label made to fit its text keeps the bottom-left corner it was created at; growing
+//   afterwards keeps the top-left corner where it is (labels read from the top down); a label
 //   that a standard panel places is placed again by the panel afterwards.
 // - Text is drawn on one line, left-aligned with one pixel of margin, centred vertically;
 //   inactive labels draw in the disabled colour.
