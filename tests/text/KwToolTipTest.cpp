@@ -8,7 +8,6 @@
 #include "platform/misc/ResourceStrings.h"
 #include "platform/testing/Harness.h"
 #include "text/KwToolTip.h"
-#include "text/ToolTipDetector.h"
 #include "text/ToolTipLayout.h"
 
 namespace {
@@ -212,12 +211,4 @@ TEST_F(ToolTipFixture, AnEnormousTextStaysWithinTheScreen) {
   // Taller than the screen: its top edge stays on it.
   EXPECT_EQ(r.y1, 300);
   h.render();
-}
-
-TEST_F(ToolTipFixture, OneDetectorPerScreen) {
-  ToolTipDetector* d = KwToolTip::registerTypes(h.root());
-  EXPECT_EQ(KwToolTip::registerTypes(h.root()), d);
-  // It takes no room and is never under the pointer.
-  EXPECT_EQ(d->width(), 0);
-  EXPECT_NE(h.root().globAt(XY<int>(0, 0)), d);
 }

@@ -155,14 +155,3 @@ TEST(TextLabel, APanelPlacesAGrownLabelAgain) {
   EXPECT_EQ(label->canvas()->rect().x1, 290);
   EXPECT_EQ(label->canvas()->rect().y1, 140);
 }
-
-TEST(TextLabel, InactiveLabelsFollowTheirAdaptor) {
-  Harness h(400, 100);
-  TextLabel* label = labelOn(h, L"Input");
-  Kw::Ptr<RecordingAdaptor> adaptor(new RecordingAdaptor);
-  label->setDataAdaptor(adaptor);
-  adaptor->setWidgetEnabledState(false);
-  EXPECT_FALSE(label->isActive());
-  adaptor->setWidgetEnabledState(true);
-  EXPECT_TRUE(label->isActive());
-}
