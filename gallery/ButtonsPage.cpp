@@ -43,9 +43,11 @@ constexpr int kGap = 16;
 constexpr int kButtonW = 96;
 constexpr int kButtonH = 26;
 
-Button* pushButton(GalleryPage& page, int left, int top, const wchar_t* label, const char* msg) {
+Button* pushButton(GalleryPage& page, int left, int top, const wchar_t* label, const char* msg,
+                   const char* help) {
   Button* b = new Button(label, String(msg), page.place(left, top, kButtonW, kButtonH));
   b->set_name(Kw::toUtf8(label));
+  b->setContextString(help);
   return b;
 }
 
@@ -54,29 +56,39 @@ void buildPushButtons(GalleryPage& page, int top) {
   const int row1 = top + 44, row2 = row1 + kButtonH + 14, row3 = row2 + kButtonH + 14;
   auto column = [](int i) { return kGap + i * (kButtonW + kGap); };
 
-  pushButton(page, column(0), row1, L"Apply", "apply");
-  pushButton(page, column(1), row1, L"Mute", "mute")->set_latching(true);
-  pushButton(page, column(2), row1, L"Solo", "solo")->set_latching(true, true);
-  pushButton(page, column(3), row1, L"Hold", "hold")->set_pressure_button(1);
+  pushButton(page, column(0), row1, L"Apply", "apply", "Sends \"apply\" when clicked");
+  pushButton(page, column(1), row1, L"Mute", "mute",
+             "Latches: \" on\" when pressed in, \" off\" when released")
+      ->set_latching(true);
+  pushButton(page, column(2), row1, L"Solo", "solo", "Latches, starting down")
+      ->set_latching(true, true);
+  pushButton(page, column(3), row1, L"Hold", "hold",
+             "Pressure button: \" pressed\", \" dragged\", \" released\"")
+      ->set_pressure_button(1);
 
-  Button* nudge = pushButton(page, column(0), row2, L"Nudge +", "nudge");
+  Button* nudge = pushButton(page, column(0), row2, L"Nudge +", "nudge", "Repeats while held down");
   nudge->set_repeating(10, 0.4);
-  Button* record = pushButton(page, column(1), row2, L"Record", "record");
+  Button* record = pushButton(page, column(1), row2, L"Record", "record",
+                              "Latching, with its own down caption and colours");
   record->set_latching(true);
   record->setDownString(L"Recording");
   record->set_downcols(Colour::fromHex(0xFFFFFF), Colour::fromHex(0xB8433A));
-  Button* flat = pushButton(page, column(2), row2, L"Flat", "flat");
+  Button* flat = pushButton(page, column(2), row2, L"Flat", "flat", "The flat style");
   flat->set_style(kButtonStyleFlat);
-  pushButton(page, column(3), row2, L"Disabled", "disabled")->setActive(false, true);
+  pushButton(page, column(3), row2, L"Disabled", "disabled", "Inactive: takes no clicks")
+      ->setActive(false, true);
 
-  Button* left = pushButton(page, column(0), row3, L"Left aligned", "left");
+  Button* left = pushButton(page, column(0), row3, L"Left aligned", "left", "Caption ranged left");
   left->set_ranged_left(1);
-  Button* quiet = pushButton(page, column(1), row3, L"No hover", "no_hover");
+  Button* quiet = pushButton(page, column(1), row3, L"No hover", "no_hover",
+                             "Does not brighten under the pointer");
   quiet->set_brightening(0);
-  Button* shadowed = pushButton(page, column(2), row3, L"Shadowed", "shadowed");
+  Button* shadowed =
+      pushButton(page, column(2), row3, L"Shadowed", "shadowed", "Caption drawn with a shadow");
   shadowed->setTextStyle(Glib::TextStyles::Shadowed);
   shadowed->setcols(Colour::fromHex(0xFFFFFF), Colour::fromHex(0x3D8FD6));
-  pushButton(page, column(3), row3, L"An overlong label that is clipped", "long");
+  pushButton(page, column(3), row3, L"An overlong label that is clipped", "long",
+             "A caption too long for its button is clipped");
 }
 
 void buildImageButtons(GalleryPage& page, int top) {

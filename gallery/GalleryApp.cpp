@@ -4,6 +4,7 @@
 
 #include "gallery/GalleryLook.h"
 #include "gallery/GalleryPages.h"
+#include "gallery/GalleryTooltips.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/misc/Diagnostics.h"
 
@@ -18,6 +19,7 @@ GalleryApp::GalleryApp(Glob& screen, MessageLog& log)
   for (const GalleryPageEntry& entry : galleryPages()) {
     auto* page = new GalleryPage(pageArea_->canvas(), entry.title, entry.summary, log_);
     entry.build(*page);
+    GalleryTooltips::explain(*page);
     page->unmap_canvas();
     pages_.push_back(page);
     selector_->addEntry(entry.title, !page->isPlanned());

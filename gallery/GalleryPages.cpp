@@ -10,6 +10,8 @@ const std::vector<GalleryPageEntry>& galleryPages() {
       {"Check boxes & radio sets", "Check boxes, tri-state boxes and one-of-many choices.",
        buildChecksPage},
       {"Text", "Single-line text entry, labels, titled text and tooltips.", buildTextPage},
+      {"Labels & tooltips",
+       "Labels bound to a value, titled text boxes, the input box and tooltips.", buildLabelsPage},
       {"Menus", "Pop-up menus, drop-down buttons and combo boxes.", buildMenusPage},
       {"Values", "Value boxes with their parsers, sliders and scroll bars.", buildValuesPage},
       {"Sliders & scroll bars",

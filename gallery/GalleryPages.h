@@ -18,6 +18,7 @@ void buildFoundationPage(GalleryPage& page);
 void buildButtonsPage(GalleryPage& page);
 void buildChecksPage(GalleryPage& page);
 void buildTextPage(GalleryPage& page);
+void buildLabelsPage(GalleryPage& page);
 void buildMenusPage(GalleryPage& page);
 void buildValuesPage(GalleryPage& page);
 void buildSlidersPage(GalleryPage& page);

@@ -27,6 +27,7 @@ TextBox* addBoxCard(GalleryPage& page, int column, int row, const String& title,
   args.info = page.place(left + kBoxInset, top + kBoxTop, kCardWidth - 2 * kBoxInset, 24);
   auto* box = new TextBox(args);
   box->set_name(name);
+  box->setContextString("A text box: " + title + "\nEvery callback it raises shows in the log");
   reportTo(page, *box);
   return box;
 }
@@ -83,4 +84,5 @@ void buildTextPage(GalleryPage& page) {
   panel->setBorderStyle(UifBorderRaised);
   panel->setTitle(L"Click to rename, Enter to keep");
   panel->addStandardWidgets(StdEditableTitleBox);
+  panel->setContextString("Click the title to rename the panel; Enter keeps the new name");
 }

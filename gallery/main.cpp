@@ -12,6 +12,7 @@
 #include "gallery/TreeDump.h"
 #include "platform/backend/HeadlessBackend.h"
 #include "platform/backend/WindowBackend.h"
+#include "text/KwToolTip.h"
 #include "text/PanelTitleTextBox.h"
 
 namespace {
@@ -83,6 +84,8 @@ int main(int argc, char** argv) {
   screen.root().setPalette(options.palette);
 
   auto app = std::make_unique<GalleryApp>(screen.root(), log);
+  // Help under the pointer for every control of every page.
+  KwToolTip::registerTypes(screen.root());
   screen.render();
   int status = 0;
   if (options.dumpTree) dumpTree(screen, scale);

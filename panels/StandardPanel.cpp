@@ -277,7 +277,12 @@ void StandardPanel::adopt(const WidgetDetails& details, Glob* insertAfter) {
 
 void StandardPanel::joinTabOrder(Glob* widget, Glob* insertAfter) {
   auto* stop = dynamic_cast<TabOrderable*>(widget);
-  if (!stop) return;
+  if (!stop) {
+    // A composite control takes part through the stops it hands out, in its own order.
+    if (auto* host = dynamic_cast<TabOrderableHost*>(widget))
+      tabOrder_.addTabStops(*host, TabOrderManager::kAfterLast);
+    return;
+  }
   unsigned order = TabOrderManager::kAfterLast;
   if (auto* after =
           is_good_glob_ptr(insertAfter) ? dynamic_cast<TabOrderable*>(insertAfter) : nullptr) {
@@ -296,6 +301,11 @@ bool StandardPanel::removeWidget(Glob* widget, bool destroy) {
   if (!widgets_.remove(widget, live)) return false;
   if (live) {
     if (auto* stop = dynamic_cast<TabOrderable*>(live)) tabOrder_.removeTabStop(*stop);
+    if (auto* host = dynamic_cast<TabOrderableHost*>(live)) {
+      std::vector<TabOrderable*> stops;
+      host->getTabOrderables(stops);
+      for (TabOrderable* s : stops) tabOrder_.removeTabStop(s);
+    }
     if (destroy) delete live;
   }
   update();

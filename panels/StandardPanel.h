@@ -14,7 +14,8 @@
 // - addWidget's last argument names the widget after which the new one goes in the widget
 //   list and in the tab order; null (or a widget not in the list) appends.
 // - A child that is a TabOrderable joins the panel's tab order when it is added and leaves it
-//   when it is removed. The standard widgets are not tab stops.
+//   when it is removed; a child that is a TabOrderableHost does the same with the stops it
+//   hands out, appended in its order. The standard widgets are not tab stops.
 // - setWidgetPos and translateWidgetPos on a relatively placed widget turn it into an
 //   absolute one from OriginBottomLeft. When a reference widget is removed or deleted, the
 //   widgets placed against it stay where they are, likewise from OriginBottomLeft.
