@@ -83,6 +83,9 @@ int main(int argc, char** argv) {
   screen.root().setPalette(options.palette);
 
   auto app = std::make_unique<GalleryApp>(screen.root(), log);
+  for (int i = 0; i < app->pageCount() && !options.startPage.empty(); ++i) {
+    if (app->pageTitle(i) == options.startPage) app->selectPage(i);
+  }
   screen.render();
   int status = 0;
   if (options.dumpTree) dumpTree(screen, scale);

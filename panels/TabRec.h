@@ -8,12 +8,15 @@
 
 #include "buttons/Checkbox.h"
 
+// The colour that stands for the look's default (fully transparent).
+inline constexpr Colour kTabDefaultColour(0.0, 0.0, 0.0, 0.0);
+
 struct TabRec {
   WString pageId;
   WString name;  // what the tab shows
   // Colours; a fully transparent colour stands for the look's default.
-  Colour face;
-  Colour text;
+  Colour face = kTabDefaultColour;
+  Colour text = kTabDefaultColour;
   // The container of the page's widgets; null for a lazy page not yet built.
   GlobHandle<> page;
   // The optional check box on the tab.

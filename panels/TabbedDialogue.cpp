@@ -131,7 +131,7 @@ StandardTabPage* TabbedDialogue::createStandardPage(const WString& pageId, const
                                                                kGlobCreateUnmapped, canvas()),
                                    false);
   page->set_name(Kw::toUtf8(pageId));
-  if (!addPage(pageId, Colour(), Colour(), colour, page, false)) {
+  if (!addPage(pageId, kTabDefaultColour, kTabDefaultColour, colour, page, false)) {
     delete page;
     return nullptr;
   }
@@ -146,7 +146,7 @@ StandardTabPage* TabbedDialogue::createTaggableStandardPage(const WString& pageI
                                                                kGlobCreateUnmapped, canvas()),
                                    true);
   page->set_name(Kw::toUtf8(pageId));
-  if (!addPage(pageId, Colour(), Colour(), colour, page, false)) {
+  if (!addPage(pageId, kTabDefaultColour, kTabDefaultColour, colour, page, false)) {
     delete page;
     return nullptr;
   }
@@ -160,7 +160,7 @@ rect* TabbedDialogue::createAndInsertRectPage(const WString& pageId, const Colou
                                                     static_cast<unsigned short>(size.y),
                                                     kGlobCreateUnmapped, canvas()));
   page->set_name(Kw::toUtf8(pageId));
-  if (!addPage(pageId, Colour(), Colour(), colour, page, false)) {
+  if (!addPage(pageId, kTabDefaultColour, kTabDefaultColour, colour, page, false)) {
     delete page;
     return nullptr;
   }
@@ -236,7 +236,7 @@ bool TabbedDialogue::setPageColour(unsigned index, const Colour& face, const Col
 }
 
 Colour TabbedDialogue::getPageColour(unsigned index) const {
-  if (index >= pageCount()) return Colour();
+  if (index >= pageCount()) return kTabDefaultColour;
   const Colour& c = strip_->record(static_cast<int>(index)).face;
   return isDefault(c) ? Glib::TabLook(getPalette()).defaultFace() : c;
 }

@@ -59,10 +59,11 @@ class TabbedDialogue : public StandardPanel {
   // --- Pages ---
   bool addPage(const WString& pageId, const Colour& tabFace, const Colour& tabText,
                const Colour& pageColour, Glob* page, bool select);
-  StandardTabPage* createStandardPage(const WString& pageId, const Colour& colour = Colour());
+  StandardTabPage* createStandardPage(const WString& pageId,
+                                      const Colour& colour = kTabDefaultColour);
   StandardTabPage* createTaggableStandardPage(const WString& pageId,
-                                              const Colour& colour = Colour());
-  rect* createAndInsertRectPage(const WString& pageId, const Colour& colour = Colour());
+                                              const Colour& colour = kTabDefaultColour);
+  rect* createAndInsertRectPage(const WString& pageId, const Colour& colour = kTabDefaultColour);
   bool removePage(unsigned index, bool destroy);
   bool removePage(const WString& pageId, bool destroy);
   int findPageIdx(const WString& pageId) const;

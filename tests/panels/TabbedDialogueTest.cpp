@@ -36,7 +36,7 @@ struct DialogueFixture : ::testing::Test {
   CountingDialogue* dlg = new CountingDialogue(GlobCreationInfo(400, 300, probe.canvas(), 10, 10));
 
   void addPages(std::initializer_list<const wchar_t*> ids) {
-    for (const wchar_t* id : ids) ASSERT_TRUE(dlg->addPageDeferred(id, Colour()));
+    for (const wchar_t* id : ids) ASSERT_TRUE(dlg->addPageDeferred(id, kTabDefaultColour));
   }
   XY<int> tabCentre(int index) {
     DialogueTab* t = dlg->tabStrip().tabGlob(index);
@@ -84,8 +84,8 @@ TEST_F(DialogueFixture, ReselectingInactiveAndUnknownChangeNothing) {
 
 TEST_F(DialogueFixture, DuplicateIdsAndRemovalOfTheCurrentPage) {
   addPages({L"A", L"B", L"C"});
-  EXPECT_FALSE(dlg->addPageDeferred(L"B", Colour()));
-  EXPECT_FALSE(dlg->addPageDeferred(L"", Colour()));
+  EXPECT_FALSE(dlg->addPageDeferred(L"B", kTabDefaultColour));
+  EXPECT_FALSE(dlg->addPageDeferred(L"", kTabDefaultColour));
   EXPECT_EQ(dlg->pageCount(), 3u);
   Glob* pageA = dlg->getPageBaseGlob(L"A");
   GlobHandle<> handleA(pageA);
@@ -147,7 +147,7 @@ TEST_F(DialogueFixture, RenamingInPlace) {
 
 TEST_F(DialogueFixture, CtrlTabCyclesAndTabsScrollWhenTheyDoNotFit) {
   for (int i = 0; i < 30; ++i) {
-    ASSERT_TRUE(dlg->addPageDeferred(L"Page " + std::to_wstring(i), Colour()));
+    ASSERT_TRUE(dlg->addPageDeferred(L"Page " + std::to_wstring(i), kTabDefaultColour));
   }
   const TabStrip& strip = dlg->tabStrip();
   EXPECT_TRUE(strip.scrolls());
@@ -176,6 +176,8 @@ TEST(TabbedDialogueSizes, CalcSizeMatchesThePageArea) {
   EXPECT_FALSE(dlg.getCheckboxState(L"Tagged"));
   EXPECT_TRUE(dlg.setCheckboxState(L"Tagged", true));
   EXPECT_TRUE(dlg.getCheckboxState(L"Tagged"));
-  EXPECT_FALSE(dlg.addPage(L"Tagged", Colour(), Colour(), Colour(), page, false));
-  EXPECT_FALSE(dlg.addPage(L"Null", Colour(), Colour(), Colour(), nullptr, false));
+  EXPECT_FALSE(
+      dlg.addPage(L"Tagged", kTabDefaultColour, kTabDefaultColour, kTabDefaultColour, page, false));
+  EXPECT_FALSE(dlg.addPage(L"Null", kTabDefaultColour, kTabDefaultColour, kTabDefaultColour,
+                           nullptr, false));
 }
