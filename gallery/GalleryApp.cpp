@@ -4,7 +4,6 @@
 
 #include "gallery/GalleryLook.h"
 #include "gallery/GalleryPages.h"
-#include "gallery/GalleryTooltips.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/misc/Diagnostics.h"
 
@@ -13,43 +12,50 @@ GalleryApp::GalleryApp(Glob& screen, MessageLog& log)
       screen_(screen),
       log_(log) {
   set_name("globkit gallery");
-  selector_ = new PageSelector(GlobCreationInfo(kSidebarWidth, 100, canvas()), log_);
-  pageArea_ = new Glob(GlobCreationInfo(100, 100, canvas()));
-  pageArea_->set_name("Page area");
-  for (const GalleryPageEntry& entry : galleryPages()) {
-    auto* page = new GalleryPage(pageArea_->canvas(), entry.title, entry.summary, log_);
-    entry.build(*page);
-    GalleryTooltips::explain(*page);
-    page->unmap_canvas();
-    pages_.push_back(page);
-    selector_->addEntry(entry.title, !page->isPlanned());
-  }
+  pages_ = new GalleryDialogue(GlobCreationInfo(100, 100, canvas()), log_);
   logView_ = new MessageLogView(GlobCreationInfo(100, kLogHeight, canvas()), log_);
   // The view may be gone by the time the log grows: the log outlives the window's Globs.
   GlobHandle<MessageLogView> view(logView_);
   log_.setListener([view] {
     if (MessageLogView* v = view.get()) v->update();
   });
-  selector_->setChoiceHandler([this](int index) { selectPage(index); });
   layout();
   selectPage(0);
 }
 
+int GalleryApp::pageCount() const {
+  return static_cast<int>(pages_->pageCount());
+}
+
+String GalleryApp::pageTitle(int index) const {
+  return index >= 0 && index < pageCount()
+             ? Kw::toUtf8(pages_->getTabName(static_cast<unsigned>(index)))
+             : String();
+}
+
+int GalleryApp::currentPage() const {
+  return pages_->pageNumber(pages_->currentPage());
+}
+
 GalleryPage* GalleryApp::page(int index) const {
-  return index >= 0 && index < pageCount() ? pages_[index] : nullptr;
+  return pages_->page(index);
 }
 
 void GalleryApp::selectPage(int index) {
-  if (!page(index)) {
+  if (index < 0 || index >= pageCount()) {
     diagWarning("gallery: no page " + std::to_string(index) + ", page kept\n");
     return;
   }
-  if (index == current_) return;
-  if (GalleryPage* old = page(current_)) old->unmap_canvas();
-  current_ = index;
-  pages_[index]->map_canvas();
-  selector_->setSelected(index);
+  pages_->selectPage(pages_->getPageID(static_cast<unsigned>(index)), true, false);
   update(Kw::Box<int>(0, height() - kHeaderHeight, width(), height()));
+}
+
+int GalleryApp::react(Event* e) {
+  if (!message_event(e)) return Glob::react(e);
+  // The dialogue's reports (a tab chosen, renamed...) are the gallery's own news.
+  log_.record("Gallery", *e);
+  update(Kw::Box<int>(0, height() - kHeaderHeight, width(), height()));
+  return 1;
 }
 
 bool GalleryApp::fitToScreen() {
@@ -65,20 +71,13 @@ void GalleryApp::reshape() {
 void GalleryApp::layout() {
   const int w = width(), h = height();
   const int below = std::max(0, h - kHeaderHeight);
-  selector_->reshape_canvas(0, 0, kSidebarWidth, below);
-  const int contentW = std::max(0, w - kSidebarWidth);
-  logView_->reshape_canvas(kSidebarWidth, 0, contentW, std::min(kLogHeight, below));
+  logView_->reshape_canvas(0, 0, w, std::min(kLogHeight, below));
   const int areaH = std::max(0, below - kLogHeight);
-  pageArea_->reshape_canvas(kSidebarWidth, kLogHeight, contentW, areaH);
-  // Pages keep their top-left corner under the header, whatever the window's height.
-  for (GalleryPage* p : pages_) {
-    p->reshape_canvas(kMargin, areaH - kMargin - GalleryPage::kHeight, GalleryPage::kWidth,
-                      GalleryPage::kHeight);
-  }
+  pages_->reshape_canvas(0, kLogHeight, w, areaH);
 }
 
 String GalleryApp::describeValue() const {
-  const GalleryPage* p = page(current_);
+  const GalleryPage* p = page(currentPage());
   return p ? p->title() : String();
 }
 
@@ -101,8 +100,8 @@ void GalleryApp::draw() {
              look.strongText());
   look.label(p, "Widget gallery", Kw::Box<int>(142, head.y0 + 8, 330, head.y1 - 8), F::Body,
              look.dimText());
-  if (const GalleryPage* cur = page(current_)) {
-    const String where = cur->title() + "   \xC2\xB7   page " + std::to_string(current_ + 1) +
+  if (const GalleryPage* cur = page(currentPage())) {
+    const String where = cur->title() + "   \xC2\xB7   page " + std::to_string(currentPage() + 1) +
                          " of " + std::to_string(pageCount());
     look.label(p, where, Kw::Box<int>(w - 420, head.y0 + 8, w - 24, head.y1 - 8), F::Body,
                look.text(), TextAlignment::Right);

@@ -9,7 +9,7 @@ constexpr int kMaxSide = 8192;
 
 const char* GalleryOptions::usage() {
   return "usage: globkit-gallery [--headless] [--screenshot DIR] [--log FILE] [--dump-tree]\n"
-         "                       [--size WxH] [--palette dark|light]\n";
+         "                       [--size WxH] [--palette dark|light] [--page TITLE]\n";
 }
 
 bool GalleryOptions::parse(int argc, char** argv, String& error) {
@@ -22,7 +22,8 @@ bool GalleryOptions::parse(int argc, char** argv, String& error) {
       dumpTree = true;
     } else if (arg == "--help" || arg == "-h") {
       help = true;
-    } else if (arg == "--screenshot" || arg == "--log" || arg == "--size" || arg == "--palette") {
+    } else if (arg == "--screenshot" || arg == "--log" || arg == "--size" || arg == "--palette" ||
+               arg == "--page") {
       if (!hasValue) {
         error = arg + " needs a value";
         return false;
@@ -30,6 +31,8 @@ bool GalleryOptions::parse(int argc, char** argv, String& error) {
       const String value = argv[++i];
       if (arg == "--screenshot") {
         screenshotDir = value;
+      } else if (arg == "--page") {
+        startPage = value;
       } else if (arg == "--log") {
         logFile = value;
       } else if (arg == "--palette") {

@@ -7,6 +7,7 @@
 //   --dump-tree         the Glob tree as JSON on stdout once the first frame is shown
 //   --size WxH          the window's size in window units (default 1280x820)
 //   --palette NAME      the look: dark (the default) or light
+//   --page TITLE        the page shown first (built at once), by its tab's title
 #include "platform/glob/Palette.h"
 #include "platform/kw/String.h"
 
@@ -16,6 +17,7 @@ struct GalleryOptions {
   bool help = false;
   String screenshotDir;
   String logFile;
+  String startPage;
   int width = 1280;
   int height = 820;
   Palette palette = Palette::dark();

@@ -86,6 +86,9 @@ int main(int argc, char** argv) {
   auto app = std::make_unique<GalleryApp>(screen.root(), log);
   // Help under the pointer for every control of every page.
   KwToolTip::registerTypes(screen.root());
+  for (int i = 0; i < app->pageCount() && !options.startPage.empty(); ++i) {
+    if (app->pageTitle(i) == options.startPage) app->selectPage(i);
+  }
   screen.render();
   int status = 0;
   if (options.dumpTree) dumpTree(screen, scale);

@@ -44,7 +44,8 @@ XY<int> PanelGeometry::originXY(CoordinateOrigin origin, const PanelFrame& frame
   const int w = frame.size.x;
   const int h = frame.size.y;
   const int bottomRaise = hasBottomStrip(frame.flags) ? kBottomStripHeight : 0;
-  const int topDrop = hasTitleStrip(frame.flags) ? kTitleStripHeight : 0;
+  const int topDrop = (hasTitleStrip(frame.flags) ? kTitleStripHeight : 0) + frame.extraTop;
+  const int left = b + frame.extraLeft;
   switch (origin) {
     case OriginBottomLeft:
       return {0, 0};
@@ -55,9 +56,9 @@ XY<int> PanelGeometry::originXY(CoordinateOrigin origin, const PanelFrame& frame
     case OriginTopRight:
       return {w, h};
     case OriginInnerBottomLeft:
-      return {b, b + bottomRaise};
+      return {left, b + bottomRaise};
     case OriginInnerTopLeft:
-      return {b, h - b - topDrop};
+      return {left, h - b - topDrop};
     case OriginInnerBottomRight:
       return {w - b, b + bottomRaise};
     case OriginInnerTopRight:

@@ -27,6 +27,10 @@ struct PanelFrame {
   int flags = 0;  // standard-widget flags
   XY<int> size;
   UifTypeOfBorder border = UifBorderNone;
+  // Further room a subclass keeps inside the border and strips (a group's title, say): the
+  // inner left origins move right by `extraLeft`, the inner top origins down by `extraTop`.
+  int extraLeft = 0;
+  int extraTop = 0;
 };
 
 class PanelGeometry {

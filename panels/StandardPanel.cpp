@@ -205,6 +205,8 @@ PanelFrame StandardPanel::frame() const {
   f.flags = std_->flags();
   f.size = XY<int>(width(), height());
   f.border = border_;
+  f.extraLeft = innerInsets_.x;
+  f.extraTop = innerInsets_.y;
   return f;
 }
 
@@ -522,4 +524,12 @@ int StandardPanel::reactToMessage(Event* e) {
   const int handled = handleMessageEvent(msg, event_to_sender_glob(e));
   if (handled) return handled;
   return self ? rect::react(e) : 1;
+}
+
+void StandardPanel::setInnerInsets(int left, int top) {
+  const XY<int> insets(left, top);
+  if (insets == innerInsets_) return;
+  innerInsets_ = insets;
+  widgets_.placeAll();
+  update();
 }

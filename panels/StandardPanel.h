@@ -195,6 +195,9 @@ class StandardPanel : public rect {
  protected:
   // A standard title widget, or null: for subclasses that restyle them.
   Glob* standardWidget(StandardWidgetFlag flag) const;
+  // Keeps `left` more pixels at the left and `top` more at the top of the user area (see
+  // PanelFrame); the children are placed again.
+  void setInnerInsets(int left, int top);
 
  private:
   static constexpr int kTitleMargin = PanelGeometry::kTitleMargin;
@@ -218,6 +221,7 @@ class StandardPanel : public rect {
   UifTypeOfBorder border_ = UifBorderNone;
   PanelWidgetList widgets_{*this};
   XY<int> minSize_;
+  XY<int> innerInsets_;
   WString title_;
   TabOrderManager tabOrder_;
   std::unique_ptr<PanelStandardWidgets> std_;

@@ -22,7 +22,7 @@ Glob* findNamed(Glob& under, const String& name) {
 
 int pageTitled(const GalleryApp& app, const String& title) {
   for (int i = 0; i < app.pageCount(); ++i)
-    if (app.page(i)->title() == title) return i;
+    if (app.pageTitle(i) == title) return i;
   return -1;
 }
 
@@ -40,7 +40,9 @@ struct GalleryFixture : ::testing::Test {
 
 TEST_F(GalleryFixture, EveryShownControlOfEveryPageHasHelp) {
   for (int i = 0; i < app->pageCount(); ++i) {
+    app->selectPage(i);  // pages are built when first chosen
     GalleryPage* page = app->page(i);
+    ASSERT_NE(page, nullptr) << app->pageTitle(i);
     for (Glob* g : page->children()) {
       if (!g->isVisible() || g->get_name().empty()) continue;
       EXPECT_FALSE(g->contextString(XY<int>(), nullptr).empty())
