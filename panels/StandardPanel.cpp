@@ -270,7 +270,7 @@ bool StandardPanel::addWidgetRelative(Glob* widget, Glob* reference, unsigned ga
 
 void StandardPanel::adopt(const WidgetDetails& details, Glob* insertAfter) {
   const WidgetDetails added = widgets_.insert(details, insertAfter);
-  recalculateWidgetPositions();
+  positionStandardWidgets();
   joinTabOrder(details.widget.get(), insertAfter);
   update();
   handleWidgetAdded(added);

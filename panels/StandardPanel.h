@@ -10,7 +10,8 @@
 //   placement); PanelStandardWidgets makes, lays out and keeps in step the standard widgets;
 //   StandardPanelDrawing.cpp holds the panel's look. Every child is placed again whenever
 //   something it depends on changes: the panel's size, border or strips, or its reference
-//   widget.
+//   widget. Adding a widget places the new one only, so a panel of N children builds in
+//   time linear in N.
 // - addWidget's last argument names the widget after which the new one goes in the widget
 //   list and in the tab order; null (or a widget not in the list) appends.
 // - A child that is a TabOrderable joins the panel's tab order when it is added and leaves it

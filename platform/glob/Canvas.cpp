@@ -1,6 +1,7 @@
 #include "platform/glob/Canvas.h"
 
 #include <algorithm>
+#include <iterator>
 
 #include "platform/glob/CanvasHost.h"
 
@@ -35,9 +36,12 @@ void Canvas::attachTo(Canvas* parent) {
 
 void Canvas::detachFromParent() {
   if (!parent_) return;
-  damage();
+  if (!parent_->tearingDown_) damage();
+  // Searched from the top: children are deleted youngest first, so a teardown finds each at
+  // the end and the whole subtree goes in linear time.
   auto& sib = parent_->children_;
-  sib.erase(std::remove(sib.begin(), sib.end(), this), sib.end());
+  auto it = std::find(sib.rbegin(), sib.rend(), this);
+  if (it != sib.rend()) sib.erase(std::next(it).base());
   parent_->childrenChanged();
   parent_ = nullptr;
 }

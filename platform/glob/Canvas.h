@@ -57,6 +57,10 @@ class Canvas {
   // Moves this canvas (and its subtree) to another parent, keeping its position numbers.
   void reparent(Canvas* newParent);
 
+  // The canvas is going away with its whole subtree: children leaving it from now on report
+  // no damage of their own, since the area of the canvas is damaged when it goes.
+  void beginTeardown() { tearingDown_ = true; }
+
   // The deepest mapped canvas at `p` (this canvas's coordinates), this one included; null when
   // `p` is outside or the canvas is unmapped.
   Canvas* hit(XY<int> p);
@@ -86,6 +90,7 @@ class Canvas {
   Kw::Box<int> rect_;
   bool mapped_ = true;
   bool opaque_ = false;
+  bool tearingDown_ = false;
   std::vector<Canvas*> children_;
   mutable ChildIndex index_;
   mutable bool indexDirty_ = true;

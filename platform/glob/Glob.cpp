@@ -58,6 +58,7 @@ void Glob::construct(const GlobCreationInfo& info) {
 
 Glob::~Glob() {
   registry().erase(this);
+  canvas_->beginTeardown();
   deleteChildren();
   canvas_.reset();
 }
