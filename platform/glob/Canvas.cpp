@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "platform/glob/CanvasHost.h"
+#include "platform/glob/ChildIndex.h"
 
 namespace {
 // Below this many children a linear scan beats the grid.
@@ -48,6 +49,15 @@ void Canvas::detachFromParent() {
 
 void Canvas::forgetSubtree() {
   if (CanvasHost* h = host()) h->canvasRemoved(this);
+}
+
+const ChildIndex& Canvas::index() const {
+  if (!index_) index_ = std::make_unique<ChildIndex>();
+  if (indexDirty_) {
+    index_->rebuild(children_, localBounds());
+    indexDirty_ = false;
+  }
+  return *index_;
 }
 
 void Canvas::childrenChanged() {
@@ -150,11 +160,7 @@ void Canvas::reparent(Canvas* newParent) {
 Canvas* Canvas::hit(XY<int> p) {
   if (!mapped_ || !localBounds().contains(p)) return nullptr;
   if (children_.size() >= kIndexThreshold) {
-    if (indexDirty_) {
-      index_.rebuild(children_, localBounds());
-      indexDirty_ = false;
-    }
-    const auto& cands = index_.candidatesAt(p);
+    const auto& cands = index().candidatesAt(p);
     for (auto it = cands.rbegin(); it != cands.rend(); ++it) {
       Canvas* c = children_[*it];
       if (Canvas* h = c->hit(p - XY<int>(c->rect_.x0, c->rect_.y0))) return h;
@@ -171,12 +177,8 @@ Canvas* Canvas::hit(XY<int> p) {
 void Canvas::childrenIn(const Kw::Box<int>& area, std::vector<Canvas*>& out) const {
   out.clear();
   if (children_.size() >= kIndexThreshold) {
-    if (indexDirty_) {
-      index_.rebuild(children_, localBounds());
-      indexDirty_ = false;
-    }
     std::vector<uint32_t> idx;
-    index_.candidatesIn(area, idx);
+    index().candidatesIn(area, idx);
     for (uint32_t i : idx) out.push_back(children_[i]);
     return;
   }

@@ -2,12 +2,13 @@
 // A drawing surface in the tree of canvases. Its position is its bottom-left corner in its
 // parent's coordinates, y upward. Children are kept in stacking order, the last on top, and
 // are clipped to their parent.
+#include <memory>
 #include <vector>
 
-#include "platform/glob/ChildIndex.h"
 #include "platform/kw/Box.h"
 
 class CanvasClient;
+class ChildIndex;
 class CanvasHost;
 class PaintSession;
 
@@ -83,6 +84,8 @@ class Canvas {
   void childrenChanged();
   void forgetSubtree();
   void damageRoot(const Kw::Box<int>& rootArea) const;
+  // The index of the children, brought up to date; made when first needed.
+  const ChildIndex& index() const;
 
   Canvas* parent_ = nullptr;
   CanvasClient* client_ = nullptr;
@@ -92,6 +95,6 @@ class Canvas {
   bool opaque_ = false;
   bool tearingDown_ = false;
   std::vector<Canvas*> children_;
-  mutable ChildIndex index_;
+  mutable std::unique_ptr<ChildIndex> index_;
   mutable bool indexDirty_ = true;
 };
