@@ -402,6 +402,9 @@ bool TabOrderManager::holdsObject(const TabOrderable* object) const {
 
 void TabOrderManager::forgetObject(TabOrderable* object) {
   WriteGuard g(lock);
+  // Searched from the newest: stops that go in the reverse of their coming cost no scan. The
+  // extremes are recomputed only when one of them went.
+  bool extremeGone = false;
   for (unsigned i = static_cast<unsigned>(stops.size()); i-- > 0;) {
     if (stops[i].object != object) continue;
     stops.erase(stops.begin() + i);
@@ -410,6 +413,17 @@ void TabOrderManager::forgetObject(TabOrderable* object) {
     } else if (currentIndex != kNone && currentIndex > i) {
       --currentIndex;
     }
+    if (i == lowestIndex || i == highestIndex) {
+      extremeGone = true;
+    } else {
+      if (lowestIndex != kNone && lowestIndex > i) --lowestIndex;
+      if (highestIndex != kNone && highestIndex > i) --highestIndex;
+    }
+    if (!allowDuplicates) break;
   }
-  recomputeExtremes();
+  if (extremeGone) {
+    recomputeExtremes();
+  } else {
+    currentOrder = currentIndex < stops.size() ? stops[currentIndex].tabOrder : kNone;
+  }
 }

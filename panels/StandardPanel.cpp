@@ -98,7 +98,12 @@ void StandardPanel::init() {
 
 StandardPanel::~StandardPanel() {
   while (modalDepth_ > 0) setModal(false);
-  for (WidgetDetails& d : widgets_.takeAll()) {
+  // Youngest first, like every Glob's children, so that each leaves the top of the stack and
+  // of the tab order; the panel's own area is repainted as it goes.
+  canvas()->beginTeardown();
+  std::vector<WidgetDetails> list = widgets_.takeAll();
+  for (auto it = list.rbegin(); it != list.rend(); ++it) {
+    WidgetDetails& d = *it;
     if (Glob* g = d.get()) {
       if (widgets_.onPanel(g)) delete g;
     } else {

@@ -22,6 +22,8 @@
 // - A child deleted behind the panel's back keeps its entry (with a null widget, counted by
 //   numWidgets) until it is removed by address or the panel is destroyed, where it is
 //   reported as a double deletion. Every other operation skips it.
+// - Destroying the panel deletes the widgets of its list youngest first, then its other
+//   children likewise.
 // - removeWidget(widget, false) only forgets the widget: it stays a child Glob and keeps its
 //   place on the canvas.
 // - The size and border of the configuration-record constructor come from the keys "width",

@@ -1,5 +1,5 @@
 // The benchmark scene S(N) with the library's own controls, measured the way the peers'
-// benchmarks measure theirs. Usage: scene [main [OUTDIR] | w5 | w6 | sizes]
+// benchmarks measure theirs. Usage: scene [main [OUTDIR] | w1 | w5 | w6 | sizes]
 #include <cstdio>
 #include <string>
 
@@ -14,6 +14,8 @@ int main(int argc, char** argv) {
     scene::runFrames();
     scene::runInput();
     scene::reportSizes(true);
+  } else if (mode == "w1") {
+    scene::runBuildAndDestroy();
   } else if (mode == "w5") {
     scene::runMemory();
   } else if (mode == "w6") {
@@ -21,7 +23,7 @@ int main(int argc, char** argv) {
   } else if (mode == "sizes") {
     scene::reportSizes(false);
   } else {
-    std::fprintf(stderr, "usage: scene [main [OUTDIR] | w5 | w6 | sizes]\n");
+    std::fprintf(stderr, "usage: scene [main [OUTDIR] | w1 | w5 | w6 | sizes]\n");
     return 2;
   }
   return 0;
