@@ -44,6 +44,10 @@ test-asan: $(ASAN_BUILD)/build.ninja
 bench: bootstrap $(BENCH_BUILD)/build.ninja
 	cmake --build $(BENCH_BUILD) -j $(JOBS)
 	@for b in $(BENCH_BUILD)/bench_*; do [ -x "$$b" ] && "$$b" --benchmark_repetitions=5 --benchmark_report_aggregates_only=true || exit 1; done
+	$(BENCH_BUILD)/scene sizes
+	$(BENCH_BUILD)/scene main
+	$(BENCH_BUILD)/scene w5
+	$(BENCH_BUILD)/scene w6
 
 demo: bootstrap $(BUILD)/build.ninja
 	cmake --build $(BUILD) -j $(JOBS) --target globkit-gallery

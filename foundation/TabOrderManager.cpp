@@ -34,13 +34,23 @@ TabOrderManager::~TabOrderManager() {
 
 bool TabOrderManager::addTabStop(TabOrderable& object, unsigned order) {
   WriteGuard g(lock);
-  if (!allowDuplicates && indexOfLocked(&object) != kNone) return false;
+  // The stop knows its managers: asking it is cheaper than searching every stop.
+  if (!allowDuplicates && object.isRegisteredWith(this)) return false;
   if (order == kAfterLast) order = stops.empty() ? 0 : highestOrder + 1;
   if (order >= kFirstReservedOrder) return false;
   if (!makeWayForTabOrder(order)) return false;
   stops.push_back(Stop{order, &object, true});
   object.registerManager(this);
-  recomputeExtremes();
+  // The extremes so far are right for the older stops; the newest loses ties.
+  const unsigned index = static_cast<unsigned>(stops.size() - 1);
+  if (lowestIndex == kNone || order < lowestOrder) {
+    lowestOrder = order;
+    lowestIndex = index;
+  }
+  if (highestIndex == kNone || order > highestOrder) {
+    highestOrder = order;
+    highestIndex = index;
+  }
   return true;
 }
 
@@ -303,6 +313,10 @@ bool TabOrderManager::internalSetTabStopFocus(unsigned index, bool flag) {
 // --- Internals (writer lock held unless noted) ---
 
 bool TabOrderManager::makeWayForTabOrder(unsigned order, unsigned excludeIndex) {
+  // An order outside the ones in use is free without looking (the usual append).
+  if (excludeIndex == kNone && (stops.empty() || order > highestOrder || order < lowestOrder)) {
+    return true;
+  }
   std::set<unsigned> taken;
   for (unsigned i = 0; i < stops.size(); ++i) {
     if (i != excludeIndex) taken.insert(stops[i].tabOrder);
@@ -388,6 +402,9 @@ bool TabOrderManager::holdsObject(const TabOrderable* object) const {
 
 void TabOrderManager::forgetObject(TabOrderable* object) {
   WriteGuard g(lock);
+  // Searched from the newest: stops that go in the reverse of their coming cost no scan. The
+  // extremes are recomputed only when one of them went.
+  bool extremeGone = false;
   for (unsigned i = static_cast<unsigned>(stops.size()); i-- > 0;) {
     if (stops[i].object != object) continue;
     stops.erase(stops.begin() + i);
@@ -396,6 +413,17 @@ void TabOrderManager::forgetObject(TabOrderable* object) {
     } else if (currentIndex != kNone && currentIndex > i) {
       --currentIndex;
     }
+    if (i == lowestIndex || i == highestIndex) {
+      extremeGone = true;
+    } else {
+      if (lowestIndex != kNone && lowestIndex > i) --lowestIndex;
+      if (highestIndex != kNone && highestIndex > i) --highestIndex;
+    }
+    if (!allowDuplicates) break;
   }
-  recomputeExtremes();
+  if (extremeGone) {
+    recomputeExtremes();
+  } else {
+    currentOrder = currentIndex < stops.size() ? stops[currentIndex].tabOrder : kNone;
+  }
 }

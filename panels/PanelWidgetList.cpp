@@ -2,8 +2,12 @@
 
 #include "panels/StandardPanel.h"
 
+bool PanelWidgetList::mayHold(const Glob* widget) const {
+  return addresses_ && addresses_->count(widget) != 0;
+}
+
 WidgetDetails* PanelWidgetList::findLiveEntry(const Glob* widget) {
-  if (!widget) return nullptr;
+  if (!widget || !mayHold(widget)) return nullptr;
   for (WidgetDetails& d : list_) {
     if (d.get() == widget) return &d;
   }
@@ -16,7 +20,7 @@ const WidgetDetails* PanelWidgetList::findLive(const Glob* widget) const {
 
 const WidgetDetails* PanelWidgetList::findAny(const Glob* widget) const {
   if (const WidgetDetails* d = findLive(widget)) return d;
-  if (!widget) return nullptr;
+  if (!widget || !mayHold(widget)) return nullptr;
   for (const WidgetDetails& d : list_) {
     if (!d.get() && d.address == widget) return &d;
   }
@@ -43,7 +47,11 @@ const WidgetDetails& PanelWidgetList::insert(const WidgetDetails& d, Glob* inser
           is_good_glob_ptr(insertAfter) ? findLive(insertAfter) : nullptr) {
     at = list_.begin() + (after - list_.data()) + 1;
   }
-  return *list_.insert(at, d);
+  if (!addresses_) addresses_ = std::make_unique<std::unordered_map<const Glob*, unsigned>>();
+  ++(*addresses_)[d.address];
+  WidgetDetails& added = *list_.insert(at, d);
+  place(added);
+  return added;
 }
 
 bool PanelWidgetList::remove(const Glob* widget, Glob*& live) {
@@ -54,7 +62,11 @@ bool PanelWidgetList::remove(const Glob* widget, Glob*& live) {
   for (WidgetDetails& other : list_) {
     if (other.relative && other.reference.refersTo(live)) makeAbsolute(other);
   }
+  const Glob* address = list_[index].address;
   list_.erase(list_.begin() + static_cast<std::ptrdiff_t>(index));
+  if (auto it = addresses_->find(address); it != addresses_->end() && --it->second == 0) {
+    addresses_->erase(it);
+  }
   return true;
 }
 
@@ -142,5 +154,6 @@ void PanelWidgetList::placeAll() {
 std::vector<WidgetDetails> PanelWidgetList::takeAll() {
   std::vector<WidgetDetails> out;
   out.swap(list_);
+  addresses_.reset();
   return out;
 }

@@ -7,6 +7,8 @@
 //
 // An entry whose child was deleted behind the panel's back stays, with a null widget, until
 // it is removed by its old address; every placement skips it.
+#include <memory>
+#include <unordered_map>
 #include <vector>
 
 #include "panels/WidgetDetails.h"
@@ -39,8 +41,9 @@ class PanelWidgetList {
   bool canAdopt(Glob* widget) const;
   bool onPanel(const Glob* widget) const;
 
-  // Moves `d`'s widget onto the panel's canvas and enters it after `insertAfter` (appends when
-  // that is null or not in the list). The caller has checked canAdopt.
+  // Moves `d`'s widget onto the panel's canvas, enters it after `insertAfter` (appends when
+  // that is null or not in the list) and places it by its rule; the others stay where they
+  // are, as nothing they depend on changed. The caller has checked canAdopt.
   const WidgetDetails& insert(const WidgetDetails& d, Glob* insertAfter);
   // Takes the entry of `widget` out (see findAny); the widgets placed against it become
   // absolute. Sets `live` to the widget when it is still alive. False when there is no entry.
@@ -66,6 +69,11 @@ class PanelWidgetList {
   void place(WidgetDetails& d);
   void makeAbsolute(WidgetDetails& d);
 
+  // Whether an entry may hold this address: a miss rules the widget out without a scan.
+  bool mayHold(const Glob* widget) const;
+
   StandardPanel& panel_;
   std::vector<WidgetDetails> list_;
+  // How many entries were made for each address (dead ones included); made with the first.
+  std::unique_ptr<std::unordered_map<const Glob*, unsigned>> addresses_;
 };

@@ -97,7 +97,12 @@ void StandardPanel::init() {
 
 StandardPanel::~StandardPanel() {
   while (modalDepth_ > 0) setModal(false);
-  for (WidgetDetails& d : widgets_.takeAll()) {
+  // Youngest first, like every Glob's children, so that each leaves the top of the stack and
+  // of the tab order; the panel's own area is repainted as it goes.
+  canvas()->beginTeardown();
+  std::vector<WidgetDetails> list = widgets_.takeAll();
+  for (auto it = list.rbegin(); it != list.rend(); ++it) {
+    WidgetDetails& d = *it;
     if (Glob* g = d.get()) {
       if (widgets_.onPanel(g)) delete g;
     } else {
@@ -271,7 +276,7 @@ bool StandardPanel::addWidgetRelative(Glob* widget, Glob* reference, unsigned ga
 
 void StandardPanel::adopt(const WidgetDetails& details, Glob* insertAfter) {
   const WidgetDetails added = widgets_.insert(details, insertAfter);
-  recalculateWidgetPositions();
+  positionStandardWidgets();
   joinTabOrder(details.widget.get(), insertAfter);
   update();
   handleWidgetAdded(added);

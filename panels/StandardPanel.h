@@ -10,7 +10,8 @@
 //   placement); PanelStandardWidgets makes, lays out and keeps in step the standard widgets;
 //   StandardPanelDrawing.cpp holds the panel's look. Every child is placed again whenever
 //   something it depends on changes: the panel's size, border or strips, or its reference
-//   widget.
+//   widget. Adding a widget places the new one only, so a panel of N children builds in
+//   time linear in N.
 // - addWidget's last argument names the widget after which the new one goes in the widget
 //   list and in the tab order; null (or a widget not in the list) appends.
 // - A child that is a TabOrderable joins the panel's tab order when it is added and leaves it
@@ -22,6 +23,8 @@
 // - A child deleted behind the panel's back keeps its entry (with a null widget, counted by
 //   numWidgets) until it is removed by address or the panel is destroyed, where it is
 //   reported as a double deletion. Every other operation skips it.
+// - Destroying the panel deletes the widgets of its list youngest first, then its other
+//   children likewise.
 // - removeWidget(widget, false) only forgets the widget: it stays a child Glob and keeps its
 //   place on the canvas.
 // - The size and border of the configuration-record constructor come from the keys "width",

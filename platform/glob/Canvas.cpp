@@ -1,8 +1,10 @@
 #include "platform/glob/Canvas.h"
 
 #include <algorithm>
+#include <iterator>
 
 #include "platform/glob/CanvasHost.h"
+#include "platform/glob/ChildIndex.h"
 
 namespace {
 // Below this many children a linear scan beats the grid.
@@ -35,15 +37,27 @@ void Canvas::attachTo(Canvas* parent) {
 
 void Canvas::detachFromParent() {
   if (!parent_) return;
-  damage();
+  if (!parent_->tearingDown_) damage();
+  // Searched from the top: children are deleted youngest first, so a teardown finds each at
+  // the end and the whole subtree goes in linear time.
   auto& sib = parent_->children_;
-  sib.erase(std::remove(sib.begin(), sib.end(), this), sib.end());
+  auto it = std::find(sib.rbegin(), sib.rend(), this);
+  if (it != sib.rend()) sib.erase(std::next(it).base());
   parent_->childrenChanged();
   parent_ = nullptr;
 }
 
 void Canvas::forgetSubtree() {
   if (CanvasHost* h = host()) h->canvasRemoved(this);
+}
+
+const ChildIndex& Canvas::index() const {
+  if (!index_) index_ = std::make_unique<ChildIndex>();
+  if (indexDirty_) {
+    index_->rebuild(children_, localBounds());
+    indexDirty_ = false;
+  }
+  return *index_;
 }
 
 void Canvas::childrenChanged() {
@@ -146,11 +160,7 @@ void Canvas::reparent(Canvas* newParent) {
 Canvas* Canvas::hit(XY<int> p) {
   if (!mapped_ || !localBounds().contains(p)) return nullptr;
   if (children_.size() >= kIndexThreshold) {
-    if (indexDirty_) {
-      index_.rebuild(children_, localBounds());
-      indexDirty_ = false;
-    }
-    const auto& cands = index_.candidatesAt(p);
+    const auto& cands = index().candidatesAt(p);
     for (auto it = cands.rbegin(); it != cands.rend(); ++it) {
       Canvas* c = children_[*it];
       if (Canvas* h = c->hit(p - XY<int>(c->rect_.x0, c->rect_.y0))) return h;
@@ -167,12 +177,8 @@ Canvas* Canvas::hit(XY<int> p) {
 void Canvas::childrenIn(const Kw::Box<int>& area, std::vector<Canvas*>& out) const {
   out.clear();
   if (children_.size() >= kIndexThreshold) {
-    if (indexDirty_) {
-      index_.rebuild(children_, localBounds());
-      indexDirty_ = false;
-    }
     std::vector<uint32_t> idx;
-    index_.candidatesIn(area, idx);
+    index().candidatesIn(area, idx);
     for (uint32_t i : idx) out.push_back(children_[i]);
     return;
   }

@@ -2,12 +2,13 @@
 // A drawing surface in the tree of canvases. Its position is its bottom-left corner in its
 // parent's coordinates, y upward. Children are kept in stacking order, the last on top, and
 // are clipped to their parent.
+#include <memory>
 #include <vector>
 
-#include "platform/glob/ChildIndex.h"
 #include "platform/kw/Box.h"
 
 class CanvasClient;
+class ChildIndex;
 class CanvasHost;
 class PaintSession;
 
@@ -57,6 +58,10 @@ class Canvas {
   // Moves this canvas (and its subtree) to another parent, keeping its position numbers.
   void reparent(Canvas* newParent);
 
+  // The canvas is going away with its whole subtree: children leaving it from now on report
+  // no damage of their own, since the area of the canvas is damaged when it goes.
+  void beginTeardown() { tearingDown_ = true; }
+
   // The deepest mapped canvas at `p` (this canvas's coordinates), this one included; null when
   // `p` is outside or the canvas is unmapped.
   Canvas* hit(XY<int> p);
@@ -79,6 +84,8 @@ class Canvas {
   void childrenChanged();
   void forgetSubtree();
   void damageRoot(const Kw::Box<int>& rootArea) const;
+  // The index of the children, brought up to date; made when first needed.
+  const ChildIndex& index() const;
 
   Canvas* parent_ = nullptr;
   CanvasClient* client_ = nullptr;
@@ -86,7 +93,8 @@ class Canvas {
   Kw::Box<int> rect_;
   bool mapped_ = true;
   bool opaque_ = false;
+  bool tearingDown_ = false;
   std::vector<Canvas*> children_;
-  mutable ChildIndex index_;
+  mutable std::unique_ptr<ChildIndex> index_;
   mutable bool indexDirty_ = true;
 };

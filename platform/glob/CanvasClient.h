@@ -4,9 +4,14 @@
 #include "platform/kw/String.h"
 #include "platform/kw/XY.h"
 
+class Glob;
+
 class CanvasClient {
  public:
   virtual ~CanvasClient() = default;
+
+  // The Glob this client is, or null: the tree asks this instead of casting.
+  virtual Glob* asGlob() { return nullptr; }
 
   // The client's type word ("button", "glob", ...).
   virtual const char* idstring() const = 0;

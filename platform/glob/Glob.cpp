@@ -2,21 +2,13 @@
 
 #include <cmath>
 #include <limits>
-#include <unordered_map>
 
+#include "platform/glob/GlobRegistry.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/glob/RuntimeClock.h"
 #include "platform/misc/Diagnostics.h"
 
 namespace {
-
-// Every live Glob with its serial: liveness checks on pointers that may dangle.
-std::unordered_map<const void*, uint64_t>& registry() {
-  static std::unordered_map<const void*, uint64_t> r;
-  return r;
-}
-
-uint64_t gNextSerial = 1;
 
 // Synchronous message nesting; deeper chains are refused rather than overflowing the stack.
 int gCallDepth = 0;
@@ -25,46 +17,55 @@ constexpr int kMaxCallDepth = 64;
 }  // namespace
 
 bool is_good_glob_ptr(const void* p) {
-  return p && registry().count(p) != 0;
+  return GlobRegistry::isLiveAddress(p);
 }
 
 bool glob_serial_is_alive(const Glob* g, uint64_t serial) {
-  auto it = registry().find(g);
-  return it != registry().end() && it->second == serial;
+  return GlobRegistry::isLive(g, serial);
 }
 
-Glob::Glob(const GlobCreationInfo& info) {
-  construct(info);
+Glob::Glob(const GlobCreationInfo& info)
+    : canvas_(info.canvas, this, Kw::Box<int>::fromSize(info.x, info.y, info.width, info.height)),
+      serial_(GlobRegistry::enter(this)),
+      palette_(info.palette) {
+  if (info.flags & kGlobCreateUnmapped) canvas_.unmap();
 }
 
-Glob::Glob(unsigned short width, unsigned short height, int flag, Canvas* parent) {
-  construct(GlobCreationInfo::withFlags(width, height, flag, parent));
-}
+Glob::Glob(unsigned short width, unsigned short height, int flag, Canvas* parent)
+    : Glob(GlobCreationInfo::withFlags(width, height, flag, parent)) {}
 
-Glob::Glob(CanvasHost* host, int width, int height) {
-  serial_ = gNextSerial++;
-  registry()[this] = serial_;
-  canvas_ = std::make_unique<Canvas>(host, this, width, height);
-}
-
-void Glob::construct(const GlobCreationInfo& info) {
-  serial_ = gNextSerial++;
-  registry()[this] = serial_;
-  palette_ = info.palette;
-  canvas_ = std::make_unique<Canvas>(
-      info.canvas, this, Kw::Box<int>::fromSize(info.x, info.y, info.width, info.height));
-  if (info.flags & kGlobCreateUnmapped) canvas_->unmap();
-}
+Glob::Glob(CanvasHost* host, int width, int height)
+    : canvas_(host, this, width, height), serial_(GlobRegistry::enter(this)) {}
 
 Glob::~Glob() {
-  registry().erase(this);
+  GlobRegistry::leave(this, serial_);
+  canvas_.beginTeardown();
   deleteChildren();
-  canvas_.reset();
+}
+
+Glob::Extras& Glob::extras() {
+  if (!extras_) extras_ = std::make_unique<Extras>();
+  return *extras_;
+}
+
+void Glob::set_name(const String& name) {
+  if (name.empty() && !extras_) return;
+  extras().name = name;
+}
+
+void Glob::setContextString(const String& text) {
+  if (text.empty() && !extras_) return;
+  extras().contextText = text;
+}
+
+void Glob::setDefaultCursor(MouseCursorID id) {
+  if (id == kCursorArrow && !extras_) return;
+  extras().cursor = id;
 }
 
 void Glob::deleteChildren() {
-  while (!canvas_->children().empty()) {
-    Canvas* c = canvas_->children().back();
+  while (!canvas_.children().empty()) {
+    Canvas* c = canvas_.children().back();
     if (Glob* g = globOf(c)) {
       delete g;
     } else {
@@ -74,23 +75,24 @@ void Glob::deleteChildren() {
 }
 
 Glob* Glob::globOf(const Canvas* c) {
-  if (!c) return nullptr;
-  Glob* g = dynamic_cast<Glob*>(c->client());
-  return is_good_glob_ptr(g) ? g : nullptr;
+  // A canvas's client lives at least as long as the canvas; a Glob being destroyed has left
+  // the registry and counts as gone.
+  Glob* g = c && c->client() ? c->client()->asGlob() : nullptr;
+  return g && GlobRegistry::isLive(g, g->serial_) ? g : nullptr;
 }
 
 Glob* Glob::parent() const {
-  for (Canvas* c = canvas_->parent(); c; c = c->parent()) {
+  for (Canvas* c = canvas_.parent(); c; c = c->parent()) {
     if (Glob* g = globOf(c)) return g;
   }
   return nullptr;
 }
 
 unsigned short Glob::height() const {
-  return static_cast<unsigned short>(canvas_->height());
+  return static_cast<unsigned short>(canvas_.height());
 }
 unsigned short Glob::width() const {
-  return static_cast<unsigned short>(canvas_->width());
+  return static_cast<unsigned short>(canvas_.width());
 }
 
 int Glob::react(Event*) {
@@ -110,26 +112,26 @@ void Glob::clear_interest(int mask) {
 }
 
 void Glob::pop_to_top() {
-  canvas_->raise();
+  canvas_.raise();
 }
 void Glob::push_to_bottom() {
-  canvas_->lower();
+  canvas_.lower();
 }
 void Glob::map_canvas() {
-  canvas_->map();
+  canvas_.map();
 }
 void Glob::unmap_canvas() {
-  canvas_->unmap();
+  canvas_.unmap();
 }
 
 void Glob::reshape_canvas(int x, int y, int width, int height) {
-  const bool resized = width != canvas_->width() || height != canvas_->height();
-  canvas_->reshape(Kw::Box<int>::fromSize(x, y, std::max(0, width), std::max(0, height)));
+  const bool resized = width != canvas_.width() || height != canvas_.height();
+  canvas_.reshape(Kw::Box<int>::fromSize(x, y, std::max(0, width), std::max(0, height)));
   if (resized) reshape();
 }
 
 void Glob::translate_canvas(int dx, int dy) {
-  canvas_->translate(dx, dy);
+  canvas_.translate(dx, dy);
 }
 
 int Glob::child_count() const {
@@ -157,7 +159,7 @@ int Glob::call_msg(Glob* target, const char* msg) {
 }
 
 String Glob::get_id() const {
-  return name_.empty() ? String(idstring()) : name_;
+  return extras_ && !extras_->name.empty() ? extras_->name : String(idstring());
 }
 
 void Glob::setActive(bool active, bool redraw) {
@@ -168,9 +170,9 @@ void Glob::setActive(bool active, bool redraw) {
 
 void Glob::setVisible(bool visible) {
   if (visible) {
-    canvas_->map();
+    canvas_.map();
   } else {
-    canvas_->unmap();
+    canvas_.unmap();
   }
 }
 
@@ -186,7 +188,7 @@ void Glob::setCol(const Colour& colour, bool redraw) {
 }
 
 void Glob::detachFromParent() {
-  canvas_->reparent(nullptr);
+  canvas_.reparent(nullptr);
 }
 
 bool Glob::m_is_type(const char* type) const {
@@ -194,42 +196,42 @@ bool Glob::m_is_type(const char* type) const {
 }
 
 String Glob::contextString(const XY<int>&, CanvasClient*) {
-  return contextText_;
+  return extras_ ? extras_->contextText : String();
 }
 
 MouseCursorID Glob::contextCursor(const XY<int>&) {
-  return defaultCursor_;
+  return defaultCursor();
 }
 
 void Glob::update() {
-  canvas_->damage();
+  canvas_.damage();
 }
 
 void Glob::update(const Kw::Box<int>& localArea) {
-  canvas_->damage(localArea);
+  canvas_.damage(localArea);
 }
 
 bool Glob::canDraw() {
-  return canvas_->isMappedToRoot() && !canvas_->visibleRootRect().empty();
+  return canvas_.isMappedToRoot() && !canvas_.visibleRootRect().empty();
 }
 
 double Glob::get_x() const {
-  return canvas_->rootOrigin().x;
+  return canvas_.rootOrigin().x;
 }
 double Glob::get_y() const {
-  return canvas_->rootOrigin().y;
+  return canvas_.rootOrigin().y;
 }
 
 std::vector<Glob*> Glob::children() const {
   std::vector<Glob*> out;
-  for (Canvas* c : canvas_->children()) {
+  for (Canvas* c : canvas_.children()) {
     if (Glob* g = globOf(c)) out.push_back(g);
   }
   return out;
 }
 
 RootGlob* Glob::root() const {
-  return dynamic_cast<RootGlob*>(canvas_->host());
+  return dynamic_cast<RootGlob*>(canvas_.host());
 }
 
 bool Glob::hasKbdFocus() const {
@@ -259,7 +261,7 @@ int Glob::clock() {
 int event_send(Event* e, bool queued) {
   if (!e) return 0;
   Glob* dest = e->dest;
-  if (!dest && e->canvas) dest = dynamic_cast<Glob*>(e->canvas->client());
+  if (!dest && e->canvas && e->canvas->client()) dest = e->canvas->client()->asGlob();
   if (!is_good_glob_ptr(dest)) return 0;
   e->dest = dest;
   if (!e->canvas) e->canvas = dest->canvas();

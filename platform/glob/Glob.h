@@ -52,7 +52,7 @@ class Glob : public CanvasClient, public Drawable {
   // Called when this Glob gains or loses the keyboard focus; hasKbdFocus() tells which.
   virtual void handle_kbd_focus() {}
   virtual String get_id() const;
-  virtual String get_name() const { return name_; }
+  virtual String get_name() const { return extras_ ? extras_->name : String(); }
   virtual void setActive(bool active, bool redraw);
   virtual void setVisible(bool visible);
   virtual void setPalette(const Palette& palette);
@@ -67,6 +67,7 @@ class Glob : public CanvasClient, public Drawable {
 
   // --- CanvasClient ---
   const char* idstring() const override { return "glob"; }
+  Glob* asGlob() override { return this; }
   String contextString(const XY<int>& pos, CanvasClient* asker) override;
   MouseCursorID contextCursor(const XY<int>& pos) override;
   void handleMouseContainment(bool inside) override {}
@@ -78,13 +79,13 @@ class Glob : public CanvasClient, public Drawable {
   bool canDraw() override;
 
   // --- Non-virtual helpers ---
-  Canvas* canvas() const { return canvas_.get(); }
+  Canvas* canvas() const { return &canvas_; }
   // Position of the canvas's bottom-left corner in the root.
   double get_x() const;
   double get_y() const;
-  void set_name(const String& name) { name_ = name; }
+  void set_name(const String& name);
   bool isActive() const { return active_; }
-  bool isVisible() const { return canvas_->isMapped(); }
+  bool isVisible() const { return canvas_.isMapped(); }
   const Palette& getPalette() const { return palette_; }
   int interest() const { return interest_; }
   void ensure_canvas_is_mapped() { map_canvas(); }
@@ -94,10 +95,10 @@ class Glob : public CanvasClient, public Drawable {
   // Whether this Glob holds the keyboard focus of its own screen.
   bool hasKbdFocus() const;
   // The help text shown by tooltips; the base contextString returns it.
-  void setContextString(const String& text) { contextText_ = text; }
+  void setContextString(const String& text);
   // The cursor the base contextCursor returns.
-  void setDefaultCursor(MouseCursorID id) { defaultCursor_ = id; }
-  MouseCursorID defaultCursor() const { return defaultCursor_; }
+  void setDefaultCursor(MouseCursorID id);
+  MouseCursorID defaultCursor() const { return extras_ ? extras_->cursor : kCursorArrow; }
 
   // Queues `msg` for `target`; it is delivered by the loop, in order, if the target still
   // exists then.
@@ -121,17 +122,23 @@ class Glob : public CanvasClient, public Drawable {
   static Glob* globOf(const Canvas* c);
 
  private:
-  void construct(const GlobCreationInfo& info);
+  // What few Globs set: made on the first setting that differs from the default.
+  struct Extras {
+    String name;
+    String contextText;
+    MouseCursorID cursor = kCursorArrow;
+  };
+  Extras& extras();
 
-  std::unique_ptr<Canvas> canvas_;
+  // The canvas lives inside its Glob: one allocation per Glob, not two. Mutable because a
+  // Glob's constness does not reach its canvas.
+  mutable Canvas canvas_;
   uint64_t serial_ = 0;
-  String name_;
-  String contextText_;
   Palette palette_;
+  std::unique_ptr<Extras> extras_;
   int interest_ = 0;
   bool active_ = true;
   bool canBeIt_ = true;
-  MouseCursorID defaultCursor_ = kCursorArrow;
 };
 
 // --- Liveness ---

@@ -6,9 +6,8 @@ namespace {
 
 // The palette of the live Glob owning `c`, or null.
 const Palette* ownerPalette(const Canvas* c) {
-  if (!c) return nullptr;
-  const auto* owner = dynamic_cast<const Glob*>(c->client());
-  return owner && is_good_glob_ptr(owner) ? &owner->getPalette() : nullptr;
+  const Glob* owner = c && c->client() ? c->client()->asGlob() : nullptr;
+  return owner && glob_serial_is_alive(owner, owner->serial()) ? &owner->getPalette() : nullptr;
 }
 
 }  // namespace

@@ -11,8 +11,9 @@ RootGlob::RootGlob(int width, int height) : Glob(this, width, height) {
 }
 
 RootGlob::~RootGlob() {
-  // The children go while the screen's own state still exists: their canvases report damage
-  // and removal to it on the way out.
+  // The children go while the screen's own state still exists: their canvases report their
+  // removal to it on the way out (damage no longer matters).
+  canvas()->beginTeardown();
   deleteChildren();
   queue_.clear();
   tickers_.clear();
