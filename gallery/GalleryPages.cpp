@@ -19,6 +19,9 @@ const std::vector<GalleryPageEntry>& galleryPages() {
        buildSlidersPage},
       {"Lists", "Cells addressed by column and row, fed by a data supplier.", buildListsPage},
       {"Panels", "Standard panels, tabbed dialogues and widget groups.", buildPanelsPage},
+      {"Groups",
+       "Widget groups inside each other, groups switched from their title, and renameable tabs.",
+       buildGroupsPage},
   };
   return pages;
 }

@@ -24,3 +24,4 @@ void buildValuesPage(GalleryPage& page);
 void buildSlidersPage(GalleryPage& page);
 void buildListsPage(GalleryPage& page);
 void buildPanelsPage(GalleryPage& page);
+void buildGroupsPage(GalleryPage& page);

@@ -4,6 +4,7 @@
 #include "gallery/SlidersPageModel.h"
 #include "gallery/ZoomStrip.h"
 #include "values/Slider.h"
+#include "values/VariBox.h"
 
 namespace {
 
@@ -39,7 +40,7 @@ void buildSliders(GalleryPage& page, int top) {
 
 void buildBoundLevel(GalleryPage& page, SlidersPageModel& model, int top) {
   const int x = 496;
-  page.addCard("ONE VALUE, TWO VIEWS", x, top, 504, 200);
+  page.addCard("ONE VALUE, TWO VIEWS (TWICE)", x, top, 504, 200);
   const int y = top + 56;
   SliderInitArgs args(page.place(x + kGap, y, 300, 24));
   args.maxValue = 10.0;
@@ -51,6 +52,18 @@ void buildBoundLevel(GalleryPage& page, SlidersPageModel& model, int top) {
   auto* meter = new LevelMeter(page.place(x + kGap, y + 48, 300, 24));
   meter->set_name("level meter");
   model.bind(meter);
+
+  // The trim: a slider and a value box bound to one model value, either one moving the other.
+  SliderInitArgs trimArgs(page.place(x + kGap, y + 96, 300, 24));
+  auto* trim = new Slider(trimArgs);
+  trim->set_name("trim slider");
+  model.bindTrim(trim);
+  VariBoxInitArgs boxArgs(
+      page.place(x + kGap + 316, y + 97, 120, VariBox::getDefaultHeight(VariBox::Compact)));
+  boxArgs.appearance = VariBox::Compact;
+  auto* box = new VariBox(boxArgs);
+  box->set_name("trim box");
+  model.bindTrim(box);
 }
 
 void buildScrolled(GalleryPage& page, int top) {
@@ -68,7 +81,8 @@ void buildZoom(GalleryPage& page, int top) {
 
 }  // namespace
 
-// Sliders of both orientations, one level shown by a slider and a meter, a view scrolled by a
+// Sliders of both orientations, one level shown by a slider and a meter, a trim edited by a
+// slider and a value box alike, a view scrolled by a
 // scroll bar that it answers, and a zoom control made from a resizable thumb.
 void buildSlidersPage(GalleryPage& page) {
   auto* model = new SlidersPageModel(page.canvas());

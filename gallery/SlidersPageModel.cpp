@@ -5,6 +5,8 @@
 
 #include "gallery/LevelMeter.h"
 #include "values/Slider.h"
+#include "values/VariBox.h"
+#include "values/VariBoxParserBasic.h"
 
 namespace {
 
@@ -33,7 +35,8 @@ class LevelAsDouble : public ValAdaptorBase<double>, public ValClient<int> {
 SlidersPageModel::SlidersPageModel(Canvas* page)
     : Glob(GlobCreationInfo(1, 1, page)),
       sliderAdaptor_(new LevelAsDouble(&level_)),
-      meterAdaptor_(new ValServerAdaptor<int>(&level_)) {
+      meterAdaptor_(new ValServerAdaptor<int>(&level_)),
+      trimAdaptor_(new ValServerAdaptor<double>(&trim_)) {
   unmap_canvas();
 }
 
@@ -45,4 +48,17 @@ void SlidersPageModel::bind(Slider* slider) {
 void SlidersPageModel::bind(LevelMeter* meter) {
   meter->setDataAdaptor(meterAdaptor_);
   meterAdaptor_->forceWidgetUpdate();
+}
+
+void SlidersPageModel::bindTrim(Slider* slider) {
+  slider->setValueRange(kTrimMin, kTrimMax);
+  slider->setDataAdaptor(trimAdaptor_);
+  trimAdaptor_->forceWidgetUpdate();
+}
+
+void SlidersPageModel::bindTrim(VariBox* box) {
+  auto* parser = new VariBoxParserBasic<double>(box, &trimText_, kTrimMin, kTrimMax, 0.1, 1.0,
+                                                trim_.getValue(), 0.0);
+  parser->setDataAdaptor(trimAdaptor_);
+  box->setParser(parser, true);
 }

@@ -3,6 +3,7 @@
 #include <map>
 
 #include "buttons/Button.h"
+#include "foundation/ValServerAdaptor.h"
 #include "panels/DialogueTab.h"
 #include "panels/LazyTabbedDialogue.h"
 #include "panels/StandardTabPage.h"
@@ -180,4 +181,54 @@ TEST(TabbedDialogueSizes, CalcSizeMatchesThePageArea) {
       dlg.addPage(L"Tagged", kTabDefaultColour, kTabDefaultColour, kTabDefaultColour, page, false));
   EXPECT_FALSE(dlg.addPage(L"Null", kTabDefaultColour, kTabDefaultColour, kTabDefaultColour,
                            nullptr, false));
+}
+
+TEST_F(DialogueFixture, ATabsCheckBoxReportsItsPageWhenClicked) {
+  addPages({L"Mix"});
+  ASSERT_TRUE(dlg->createTaggableStandardPage(L"Sends"));
+  ValServer<bool> enabled(false);
+  ASSERT_TRUE(dlg->setCheckboxDataAdaptor(L"Sends", new ValServerAdaptor<bool>(&enabled)));
+  Checkbox* box = dlg->tabStrip().record(dlg->findPageIdx(L"Sends")).checkbox.get();
+  ASSERT_TRUE(box && box->isVisible());
+  probe.clear();
+
+  h.clickOn(*box);
+  h.pump();
+  ASSERT_EQ(probe.texts(), std::vector<String>{"TabCheckbox Sends TICKED"});
+  EXPECT_EQ(probe.last()->sender, dlg);
+  EXPECT_TRUE(dlg->getCheckboxState(L"Sends"));
+  EXPECT_TRUE(enabled.getValue());
+  // Ticking a tab's box is not choosing its page.
+  EXPECT_EQ(dlg->currentPage(), L"Mix");
+
+  h.clickOn(*box);
+  h.pump();
+  EXPECT_EQ(probe.texts(),
+            (std::vector<String>{"TabCheckbox Sends TICKED", "TabCheckbox Sends CLEAR"}));
+  EXPECT_FALSE(dlg->getCheckboxState(L"Sends"));
+  EXPECT_FALSE(enabled.getValue());
+  EXPECT_EQ(probe.count("TabChanged"), 0);
+}
+
+TEST(TabCheckboxReports, TheReceiverMayDeleteTheDialogue) {
+  struct Deleter : Glob {
+    using Glob::Glob;
+    int react(Event* e) override {
+      if (!message_event(e)) return Glob::react(e);
+      texts.push_back(e->text());
+      delete event_to_sender_glob(e);
+      return 1;
+    }
+    std::vector<String> texts;
+  };
+  Harness h(400, 300);
+  auto* owner = new Deleter(h.place(0, 0, 400, 300));
+  auto* dlg = new TabbedDialogue(GlobCreationInfo(300, 200, owner->canvas(), 10, 10));
+  ASSERT_TRUE(dlg->createTaggableStandardPage(L"Tagged"));
+  GlobHandle<> handle(dlg);
+  h.clickOn(*dlg->tabStrip().record(0).checkbox.get());
+  h.pump();
+  EXPECT_FALSE(handle.alive());
+  EXPECT_EQ(owner->texts, std::vector<String>{"TabCheckbox Tagged TICKED"});
+  h.pump();
 }

@@ -1,5 +1,7 @@
 #include "platform/glib/look/GroupLook.h"
 
+#include <cmath>
+
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
 #include "platform/glib/Symbols.h"
@@ -22,7 +24,19 @@ void edges(Painter& p, const Kw::Box<int>& b, int gx0, int gx1, const Colour& to
   p.fillRect(Kw::Box<int>(b.x1 - 1, b.y0, b.x1, b.y1), bottomRight);
 }
 
+double luminance(const Colour& c) {
+  return 0.2126 * c.r + 0.7152 * c.g + 0.0722 * c.b;
+}
+
 }  // namespace
+
+Colour GroupLook::lightSide(const Colour& edge) const {
+  const Colour& light = palette_.get(Palette::Light);
+  const Colour& face = palette_.get(Palette::Window);
+  if (std::abs(luminance(light) - luminance(face)) >= kMinLightContrast) return light;
+  // Halfway from the edge to the face: the frame stays closed, its bevel still reads.
+  return Colour((edge.r + face.r) / 2, (edge.g + face.g) / 2, (edge.b + face.b) / 2, edge.a);
+}
 
 Colour GroupLook::defaultEdge() const {
   return palette_.get(Palette::Shadow);
@@ -44,10 +58,10 @@ void GroupLook::frame(Painter& p, const Kw::Box<int>& box, Frame kind, const Col
     case Frame::None:
       break;
     case Frame::Raised:
-      edges(p, b, gapX0, gapX1, light, edge);
+      edges(p, b, gapX0, gapX1, lightSide(edge), edge);
       break;
     case Frame::Sunken:
-      edges(p, b, gapX0, gapX1, edge, light);
+      edges(p, b, gapX0, gapX1, edge, lightSide(edge));
       break;
     default:  // etched: the edge colour with a light line inside it
       edges(p, Kw::Box<int>(b.x0, b.y0 + 1, b.x1 - 1, b.y1), gapX0, gapX1, edge, edge);

@@ -19,6 +19,10 @@ class GroupLook {
 
   // The gap left in the frame's top edge either side of the title.
   static constexpr int kTitleGap = 4;
+  // How far in luminance (0..1) the light side of a raised or sunken frame must stand from the
+  // window face to be seen; a palette whose light colour is closer (a light palette, where it
+  // is white on near white) gets a softened edge colour there instead.
+  static constexpr double kMinLightContrast = 0.15;
 
   explicit GroupLook(const Palette& palette) : palette_(palette) {}
 
@@ -39,6 +43,9 @@ class GroupLook {
   void sizeToggle(Painter& p, const Kw::Box<int>& box, bool minimised, bool active) const;
 
  private:
+  // The colour of the light side of a raised or sunken frame drawn with `edge`.
+  Colour lightSide(const Colour& edge) const;
+
   const Palette& palette_;
 };
 
