@@ -2,42 +2,21 @@
 
 #include "buttons/Button.h"
 #include "buttons/Checkbox.h"
-#include "platform/glib/Painter.h"
 #include "platform/glob/RootGlob.h"
 #include "text/TextBox.h"
+#include "values/Slider.h"
 
 namespace scene {
 
 namespace {
 
-// The slider cell until the real slider lands: a sunken track across the middle and a raised
-// thumb at the value, drawn from the palette like the other controls.
-class SliderCell : public Glob {
- public:
-  SliderCell(const GlobCreationInfo& info, double value) : Glob(info), value_(value) {}
-  void draw() override {
-    Glib::Painter p(*canvas());
-    const Palette& pal = getPalette();
-    const int w = width();
-    const int h = height();
-    p.fillRect(p.bounds(), pal.get(Palette::Window));
-    p.depthBox(Kw::Box<int>(6, h / 2 - 2, w - 6, h / 2 + 2), Glib::Bevel::Sunken, 1,
-               pal.get(Palette::Light), pal.get(Palette::Shadow), pal.get(Palette::Base));
-    const int x = 6 + static_cast<int>(value_ * (w - 12));
-    p.depthBox(Kw::Box<int>(x - 5, 3, x + 5, h - 3), Glib::Bevel::Raised, 2,
-               pal.get(Palette::Light), pal.get(Palette::Shadow), pal.get(Palette::Button));
-  }
-  const char* idstring() const override { return "slider"; }
-
- private:
-  double value_;
-};
-
 constexpr double kSliderValue = 0.5;
 
 // The one place that makes a slider cell.
 Glob* makeSlider(const GlobCreationInfo& info) {
-  return new SliderCell(info, kSliderValue);
+  SliderInitArgs args(info);
+  args.position = kSliderValue;  // range 0..1, no label, no value text
+  return new Slider(args);
 }
 
 Glob* makeControl(int i, const GlobCreationInfo& info) {
