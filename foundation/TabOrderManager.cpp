@@ -39,6 +39,7 @@ bool TabOrderManager::addTabStop(TabOrderable& object, unsigned order) {
   if (order == kAfterLast) order = stops.empty() ? 0 : highestOrder + 1;
   if (order >= kFirstReservedOrder) return false;
   if (!makeWayForTabOrder(order)) return false;
+  ascending_ = ascending_ && (stops.empty() || order > stops.back().tabOrder);
   stops.push_back(Stop{order, &object, true});
   object.registerManager(this);
   // The extremes so far are right for the older stops; the newest loses ties.
@@ -335,14 +336,27 @@ bool TabOrderManager::makeWayForTabOrder(unsigned order, unsigned excludeIndex) 
       ++stops[i].tabOrder;
     }
   }
+  ascending_ = false;  // the scan below finds out again
   recomputeExtremes();
   return true;
 }
 
 void TabOrderManager::recomputeExtremes() {
   lowestOrder = lowestIndex = highestOrder = highestIndex = kNone;
+  // Orders rising with the index (stops appended in order, removed in any order) keep their
+  // extremes at the ends: no scan, so a panel's stops leave in linear time.
+  if (ascending_ && !stops.empty()) {
+    lowestIndex = 0;
+    lowestOrder = stops.front().tabOrder;
+    highestIndex = static_cast<unsigned>(stops.size() - 1);
+    highestOrder = stops.back().tabOrder;
+    currentOrder = currentIndex < stops.size() ? stops[currentIndex].tabOrder : kNone;
+    return;
+  }
+  ascending_ = true;
   for (unsigned i = 0; i < stops.size(); ++i) {
     const unsigned o = stops[i].tabOrder;
+    if (i > 0 && o <= stops[i - 1].tabOrder) ascending_ = false;
     if (lowestIndex == kNone || o < lowestOrder) {
       lowestOrder = o;
       lowestIndex = i;
@@ -386,6 +400,7 @@ bool TabOrderManager::setTabOrderLocked(unsigned index, unsigned order) {
   if (stops[index].tabOrder == order) return true;
   if (!makeWayForTabOrder(order, index)) return false;
   stops[index].tabOrder = order;
+  ascending_ = false;  // the scan below finds out again
   recomputeExtremes();
   return true;
 }

@@ -97,6 +97,8 @@ class TabOrderManager {
   bool internalSetTabStopFocus(unsigned index, bool flag);
   // The rest run with the writer lock held.
   bool makeWayForTabOrder(unsigned order, unsigned excludeIndex = kNone);
+  // Finds the lowest and highest stops again; a scan only when the orders do not rise with the
+  // index.
   void recomputeExtremes();
   unsigned indexOfLocked(const TabOrderable* object) const;
   // Removes stop `index`; returns the object when it had the focus.
@@ -119,5 +121,6 @@ class TabOrderManager {
   unsigned lowestIndex = kNone;
   unsigned highestOrder = kNone;
   unsigned highestIndex = kNone;
+  bool ascending_ = true;  // every stop's order is above the one before it
   std::shared_ptr<bool> alive_ = std::make_shared<bool>(true);
 };
