@@ -15,7 +15,7 @@
 // - `swapFields`' third argument is the column in which the user dragged the row.
 // - A supplier may be asked for cells beyond its rows (a table showing the end while rows are
 //   taken away); it answers with empty text.
-// - The field types name what the text holds; the table only uses them to align numbers.
+// - The field types name what the text holds; a table does not interpret them.
 #include <map>
 #include <utility>
 #include <vector>
