@@ -305,6 +305,14 @@ void DataTable::tagRange(unsigned from, unsigned to) {
 
 // --- Editing ---
 
+CellEditor* DataTable::editor() const {
+  return editor_.get();
+}
+
+ChoiceList* DataTable::choiceList() const {
+  return chooser_.get();
+}
+
 bool DataTable::isEditing() const {
   return editor_.alive() || chooser_.alive();
 }

@@ -107,8 +107,8 @@ class DataTable : public rect, public GlobTabStop {
   // Stores (or drops) an edit in progress; nothing when there is none.
   void endEdit(bool store);
   bool isEditing() const;
-  CellEditor* editor() const { return editor_.get(); }
-  ChoiceList* choiceList() const { return chooser_.get(); }
+  CellEditor* editor() const;
+  ChoiceList* choiceList() const;
 
   // --- Glob ---
   int react(Event* e) override;
