@@ -152,35 +152,61 @@ bool SqliteRecordSet::readSchema() {
 
 bool SqliteRecordSet::countRows() {
   dense_ = false;
-  const String o = hasOrder_ ? quoted(orderColumn_) : String("NULL");
-  // One pass: the rows, and whether the order values are exactly 0..rows-1 (then, being
-  // unique, they are the row indexes).
-  sqlite3_stmt* st = prepare(db_, "SELECT count(*), count(" + o + "), min(" + o + "), max(" + o +
-                                      "), typeof(min(" + o + ")) FROM " + quoted(table_));
+  if (hasOrder_ && !orderHasGaps_ && uniqueOrder() && countByKey()) return true;
+  sqlite3_stmt* st = prepare(db_, "SELECT count(*) FROM " + quoted(table_));
   if (!st || sqlite3_step(st) != SQLITE_ROW) {
     sqlite3_finalize(st);
     fail("cannot count the rows of \"" + table_ + "\"");
     return false;
   }
-  const sqlite3_int64 n = sqlite3_column_int64(st, 0);
-  rowCount_ = static_cast<unsigned>(std::clamp<sqlite3_int64>(n, 0, 0x7FFFFFFF));
-  const auto* minType = reinterpret_cast<const char*>(sqlite3_column_text(st, 4));
-  const bool fullRange = n > 0 && sqlite3_column_int64(st, 1) == n && minType &&
-                         String(minType) == "integer" && sqlite3_column_int64(st, 2) == 0 &&
-                         sqlite3_column_int64(st, 3) == n - 1;
+  rowCount_ =
+      static_cast<unsigned>(std::clamp<sqlite3_int64>(sqlite3_column_int64(st, 0), 0, 0x7FFFFFFF));
   sqlite3_finalize(st);
-  if (!fullRange) return true;
+  return true;
+}
 
-  st = prepare(db_,
-               "SELECT count(*) FROM pragma_index_list(?1) AS l, pragma_index_info(l.name) AS i "
-               "WHERE l.\"unique\" = 1 AND i.name = ?2 AND "
-               "(SELECT count(*) FROM pragma_index_info(l.name)) = 1");
-  if (st) {
-    sqlite3_bind_text(st, 1, table_.c_str(), -1, SQLITE_TRANSIENT);
-    sqlite3_bind_text(st, 2, orderColumn_.c_str(), -1, SQLITE_TRANSIENT);
-    dense_ = sqlite3_step(st) == SQLITE_ROW && sqlite3_column_int64(st, 0) > 0;
+bool SqliteRecordSet::uniqueOrder() {
+  sqlite3_stmt* st =
+      prepare(db_,
+              "SELECT count(*) FROM pragma_index_list(?1) AS l, pragma_index_info(l.name) AS i "
+              "WHERE l.\"unique\" = 1 AND i.name = ?2 AND "
+              "(SELECT count(*) FROM pragma_index_info(l.name)) = 1");
+  if (!st) return false;
+  sqlite3_bind_text(st, 1, table_.c_str(), -1, SQLITE_TRANSIENT);
+  sqlite3_bind_text(st, 2, orderColumn_.c_str(), -1, SQLITE_TRANSIENT);
+  const bool unique = sqlite3_step(st) == SQLITE_ROW && sqlite3_column_int64(st, 0) > 0;
+  sqlite3_finalize(st);
+  return unique;
+}
+
+bool SqliteRecordSet::countByKey() {
+  // Each of these is one walk down the index. With unique whole numbers from 0 and no NULLs,
+  // the rows are 0..max, unless there are gaps: a page read by key finds those and falls back
+  // to counting (loadPage).
+  const String o = quoted(orderColumn_);
+  const String t = quoted(table_);
+  auto single = [&](const String& sql, sqlite3_int64& value, String& type) {
+    sqlite3_stmt* st = prepare(db_, sql);
+    bool ok = st && sqlite3_step(st) == SQLITE_ROW;
+    if (ok) {
+      value = sqlite3_column_int64(st, 0);
+      type = sqlite3_column_type(st, 0) == SQLITE_INTEGER ? "integer" : "other";
+    }
     sqlite3_finalize(st);
+    return ok;
+  };
+  sqlite3_int64 lo = 0, hi = 0, nulls = 0;
+  String loType, hiType, nullType;
+  if (!single("SELECT min(" + o + ") FROM " + t, lo, loType) ||
+      !single("SELECT max(" + o + ") FROM " + t, hi, hiType) ||
+      !single("SELECT EXISTS (SELECT 1 FROM " + t + " WHERE " + o + " IS NULL)", nulls, nullType)) {
+    return false;
   }
+  if (loType != "integer" || hiType != "integer" || nulls != 0 || lo != 0 || hi >= 0x7FFFFFFF) {
+    return false;
+  }
+  rowCount_ = static_cast<unsigned>(hi + 1);
+  dense_ = true;
   return true;
 }
 
@@ -207,6 +233,7 @@ void SqliteRecordSet::refresh() {
   if (!db_) return;
   pages_.clear();
   ++version_;
+  orderHasGaps_ = false;  // perhaps mended meanwhile; a page read will tell
   if (!countRows() || !prepareSelect()) close();
 }
 
@@ -284,6 +311,27 @@ bool SqliteRecordSet::loadPage(unsigned first, Page& page) {
     return false;
   }
   ++pagesRead_;
+  if (dense_ && !pageIsDense(page)) {
+    // The order values have gaps: count the rows and find pages by counting from now on.
+    orderHasGaps_ = true;
+    pages_.clear();
+    ++version_;
+    if (!countRows() || !prepareSelect()) {
+      close();
+      return false;
+    }
+    page = Page();
+    return loadPage(first, page);
+  }
+  return true;
+}
+
+bool SqliteRecordSet::pageIsDense(const Page& page) const {
+  const unsigned expected = std::min(kPageRows, rowCount_ - std::min(rowCount_, page.first));
+  if (page.order.size() != expected) return false;
+  for (size_t i = 0; i < page.order.size(); ++i) {
+    if (page.order[i] != static_cast<sqlite3_int64>(page.first + i)) return false;
+  }
   return true;
 }
 

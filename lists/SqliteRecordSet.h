@@ -1,13 +1,15 @@
 #pragma once
 // A record set over one table of an SQLite database file.
 //
-// - Opening reads the schema, the row count and the ends of the order column; rows are read
-//   a page (kPageRows rows) at a time when asked for, and the last kCachedPages pages are kept.
+// - Opening reads the schema and the row count; rows are read a page (kPageRows rows) at a
+//   time when asked for, and the last kCachedPages pages are kept.
 // - Rows are shown in the order of the order column (given at opening, "position" unless
 //   said otherwise) when the table has it, else in the order they were inserted. The order
-//   column itself is not shown. When it holds exactly 0..rows-1 under a unique index, a page
-//   is found by its key, so the end of a million rows costs what the start does; otherwise
-//   by counting from the start.
+//   column itself is not shown. When it holds whole numbers from 0 under a unique index and
+//   no NULLs, the rows are counted and found by their key: opening and reading the end of a
+//   million rows cost what they cost for a hundred. A page read that way that finds a gap in
+//   the numbers switches to counting the rows and finding pages by counting from the start
+//   (the version changes, and the row count may shrink).
 // - Every statement binds its values; table and column names are checked against the schema
 //   before they are put into a statement, and quoted.
 // - A store checks the text against the column's type (an integer column takes only whole
@@ -83,6 +85,9 @@ class SqliteRecordSet : public oledb {
   bool open(const String& path);
   bool readSchema();
   bool countRows();
+  bool uniqueOrder();
+  bool countByKey();
+  bool pageIsDense(const Page& page) const;
   bool prepareSelect();
   void fail(const String& what);
   void close();
@@ -98,6 +103,7 @@ class SqliteRecordSet : public oledb {
   String orderColumn_;
   bool hasOrder_ = false;
   bool dense_ = false;
+  bool orderHasGaps_ = false;  // found by a page read: count instead
   bool writable_ = false;
   std::vector<Field> fields_;
   unsigned rowCount_ = 0;

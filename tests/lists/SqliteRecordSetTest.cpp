@@ -255,3 +255,18 @@ TEST_F(SqliteRecordSetTest, AReadOnlyFileIsShownButNotChanged) {
   std::filesystem::permissions(db, std::filesystem::perms::owner_all);
   EXPECT_EQ(query(db, "SELECT name FROM clips WHERE position = 2"), "clip2");
 }
+
+TEST_F(SqliteRecordSetTest, AGapInTheOrderIsFoundWhenItsPageIsRead) {
+  makeClips(300);
+  run(db, "DELETE FROM clips WHERE position = 200");
+  SqliteRecordSet rs(db, "clips");
+  EXPECT_TRUE(rs.readsByKey());
+  EXPECT_EQ(rs.rowCount(), 300u);  // counted by its ends, not yet by its rows
+  EXPECT_STREQ(rs.text(10, 0), "clip10");
+  const unsigned long v = rs.version();
+  EXPECT_STREQ(rs.text(200, 0), "clip201");  // the page with the gap
+  EXPECT_FALSE(rs.readsByKey());
+  EXPECT_EQ(rs.rowCount(), 299u);
+  EXPECT_NE(rs.version(), v);
+  EXPECT_STREQ(rs.text(298, 0), "clip299");
+}
