@@ -1,6 +1,7 @@
 // The menu-owning base: building the list, and group states kept in the preferences.
 #include <gtest/gtest.h>
 
+#include "panels/StandardPanel.h"
 #include "platform/misc/ResourceStrings.h"
 #include "tests/menus/MenuTestSupport.h"
 #include "tests/platform/TempDir.h"
@@ -198,6 +199,34 @@ TEST_F(GroupStates, SurviveARestartThroughThePreferencesFile) {
   prefs().setPath("");
   prefs().setPath(dir.file("prefs"));  // read back from the file
   EXPECT_EQ(prefs().getPreference(name("Edit")), "CompressedGroupItem");
+}
+
+// A panel that takes every message for itself still hears its pop-up close.
+TEST_F(GroupStates, APanelThatHandlesAllMessagesStillSavesThem) {
+  class GreedyPanel : public StandardPanel {
+   public:
+    using StandardPanel::StandardPanel;
+    int handleMessageEvent(const String& msg, Glob*) override {
+      heard.push_back(msg);
+      return 1;
+    }
+    std::vector<String> heard;
+  };
+  auto* panel = new GreedyPanel(h.place(230, 20, 160, 200));
+  panel->setMenuPrefsKey("Tools");
+  panel->startMenuGroup(L"View");
+  panel->addMenuItem(L"a", "a");
+  panel->startMenuGroup(L"Edit");
+  panel->addMenuItem(L"b", "b");
+  h.click(XY<int>(300, 200), MouseButton::Right);
+  Menu* m = panel->openMenu();
+  ASSERT_NE(m, nullptr);
+  const Kw::Box<int> a = m->itemArea(0);
+  const XY<int> o = m->canvas()->rootOrigin();
+  h.click(XY<int>(o.x + a.x0 + 30, o.y + (a.y0 + a.y1) / 2));  // fold View
+  h.click(XY<int>(10, 290));                                   // close
+  EXPECT_EQ(panel->openMenu(), nullptr);
+  EXPECT_EQ(prefs().getPreference(name("View")), "CompressedGroupItem");
 }
 
 }  // namespace
