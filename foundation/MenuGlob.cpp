@@ -259,7 +259,7 @@ Menu* MenuGlob::makeMenu(Event* e, bool movePopup) {
                (menuOptions & 16u ? MenuData::kShowTitle : 0u);
   data.hasBaseColour = hasMenuBaseCol;
   data.baseColour = menuBaseCol;
-  auto* m = new Menu(data);
+  auto* m = new Menu(std::move(data));
   m->restoreGroupStates(menuPrefsKey);
   if (!m->popUp(*screen, screen->pointer())) {
     delete m;

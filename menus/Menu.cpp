@@ -28,19 +28,34 @@ constexpr int kMinItemHeight = 20;
 constexpr int kItemPadding = 5;
 const WString kSeparator = L"||";
 
-// The `count` indices whose `lengths` are largest.
-std::vector<int> longest(const std::vector<size_t>& lengths, int count) {
-  std::vector<int> order;
-  order.reserve(lengths.size());
-  for (size_t i = 0; i < lengths.size(); ++i) {
-    if (lengths[i] > 0) order.push_back(static_cast<int>(i));
+// The indices of the longest texts offered, at most Menu::kMeasuredItems of them.
+class Longest {
+ public:
+  void offer(size_t length, int index) {
+    if (length == 0) return;
+    if (n_ == kSize && length <= entries_[n_ - 1].length) return;
+    int at = n_ < kSize ? n_++ : kSize - 1;
+    while (at > 0 && entries_[at - 1].length < length) {
+      entries_[at] = entries_[at - 1];
+      --at;
+    }
+    entries_[at] = Entry{length, index};
   }
-  const size_t n = std::min(order.size(), static_cast<size_t>(count));
-  std::partial_sort(order.begin(), order.begin() + static_cast<std::ptrdiff_t>(n), order.end(),
-                    [&](int a, int b) { return lengths[a] > lengths[b]; });
-  order.resize(n);
-  return order;
-}
+  std::vector<int> indices() const {
+    std::vector<int> out;
+    for (int i = 0; i < n_; ++i) out.push_back(entries_[i].index);
+    return out;
+  }
+
+ private:
+  static constexpr int kSize = Menu::kMeasuredItems;
+  struct Entry {
+    size_t length = 0;
+    int index = -1;
+  };
+  Entry entries_[kSize];
+  int n_ = 0;
+};
 
 }  // namespace
 
@@ -59,6 +74,16 @@ Menu::Menu(const MenuData& data, Glob* owner, int width, int height, unsigned fl
 }
 
 Menu::Menu(const MenuData& data) : Menu(data, data.owner, data.widthHint, 0, data.flags) {}
+
+Menu::Menu(MenuData&& data) : Glob(GlobCreationInfo(1, 1, nullptr)) {
+  items_ = std::move(data.items);
+  flags_ = data.flags;
+  hasBaseColour_ = data.hasBaseColour;
+  baseColour_ = data.baseColour;
+  maxVisibleRows_ = data.maxVisibleRows;
+  if (data.owner) setPalette(data.owner->getPalette());
+  init(data.owner, data.widthHint, (data.flags & MenuData::kShowTitle) ? kTitleMode : 0);
+}
 
 Menu::Menu(const std::vector<MenuItem>& items) : Glob(GlobCreationInfo(1, 1, nullptr)) {
   items_ = items;
@@ -266,13 +291,18 @@ void Menu::rebuild() {
 }
 
 void Menu::rebuildRows() {
-  const std::vector<bool> hidden = MenuItemList::hiddenFlags(items_);
   rows_.clear();
   rows_.reserve(items_.size());
   iconicCount_ = 0;
+  bool closed = false;  // the nearest header above is compressed
   for (size_t i = 0; i < items_.size(); ++i) {
-    if (items_[i].type() == IconicMenuItem) ++iconicCount_;
-    if (!hidden[i]) rows_.push_back(static_cast<int>(i));
+    const MenuItemType t = items_[i].type();
+    if (t == IconicMenuItem) {
+      ++iconicCount_;
+      continue;
+    }
+    if (t == ExpandedGroupItem || t == CompressedGroupItem) closed = t == CompressedGroupItem;
+    if (t != GroupedMenuItem || !closed) rows_.push_back(static_cast<int>(i));
   }
 }
 
@@ -301,28 +331,32 @@ int Menu::rowsRight() const {
 }
 
 int Menu::measureWidth() const {
-  std::vector<size_t> labelLengths(items_.size(), 0);
-  std::vector<size_t> rightLengths(items_.size(), 0);
+  // One pass keeps the kMeasuredItems longest labels and right-hand texts; only they are
+  // measured.
+  Longest labels;
+  Longest rights;
   bool anyOptions = false;
   for (size_t i = 0; i < items_.size(); ++i) {
     const MenuItem& it = items_[i];
     if (it.type() == IconicMenuItem) continue;
     const WString& label = it.label();
     const size_t sep = label.find(kSeparator);
-    labelLengths[i] = sep == WString::npos ? label.size() : sep;
+    labels.offer(sep == WString::npos ? label.size() : sep, static_cast<int>(i));
     if (!it.options().empty()) {
       anyOptions = true;
-      for (const WString& o : it.options()) rightLengths[i] = std::max(rightLengths[i], o.size());
+      size_t widest = 0;
+      for (const WString& o : it.options()) widest = std::max(widest, o.size());
+      rights.offer(widest, static_cast<int>(i));
     } else if (sep != WString::npos) {
-      rightLengths[i] = label.size() - sep - kSeparator.size();
+      rights.offer(label.size() - sep - kSeparator.size(), static_cast<int>(i));
     }
   }
   int labelW = 0;
-  for (int i : longest(labelLengths, kMeasuredItems)) {
+  for (int i : labels.indices()) {
     labelW = std::max(labelW, fontFor(items_[i])->textWidth(items_[i].getDisplayString()));
   }
   int rightW = 0;
-  for (int i : longest(rightLengths, kMeasuredItems)) {
+  for (int i : rights.indices()) {
     const MenuItem& it = items_[i];
     const Glib::FontPtr f = fontFor(it);
     if (it.options().empty()) rightW = std::max(rightW, f->textWidth(it.getRightAlignedText()));
@@ -355,7 +389,7 @@ void Menu::relayout() {
     bar->reshape_canvas(w - 1 - t, 1, t, std::max(ScrollBar::minSizePixels(), rowsTop() - 1));
   }
   int k = 0;
-  for (const GlobHandle<>& g : widgets_) {
+  for (const auto& [index, g] : widgets_) {
     if (Glob* b = g.get()) {
       b->reshape_canvas(2 + k * (kIconSize + 2), rowsTop() + 2, kIconSize, kIconSize);
       ++k;
@@ -432,7 +466,6 @@ int Menu::findItemAtPos(const XY<int>& pos) const {
 
 void Menu::createWidgetsForItems() {
   destroyWidgets();
-  widgets_.assign(items_.size(), GlobHandle<>());
   if (iconicCount_ == 0) return;
   for (size_t i = 0; i < items_.size(); ++i) {
     if (items_[i].type() != IconicMenuItem) continue;
@@ -443,26 +476,28 @@ void Menu::createWidgetsForItems() {
     auto* b = new ImageButton(up, down, items_[i].msg(), kIconSize, kIconSize, canvas());
     b->setActive(items_[i].getActive(), false);
     if (!items_[i].getTooltip().empty()) b->setContextString(Kw::toUtf8(items_[i].getTooltip()));
-    widgets_[i] = GlobHandle<>(b);
+    widgets_.emplace_back(static_cast<int>(i), GlobHandle<>(b));
   }
 }
 
 void Menu::destroyWidgets() {
-  for (GlobHandle<>& g : widgets_) {
+  for (auto& [index, g] : widgets_) {
     if (Glob* b = g.get()) delete b;
   }
   widgets_.clear();
 }
 
 Glob* Menu::widgetForItem(int index) const {
-  if (index < 0 || static_cast<size_t>(index) >= widgets_.size()) return nullptr;
-  return widgets_[index].get();
+  for (const auto& [i, g] : widgets_) {
+    if (i == index) return g.get();
+  }
+  return nullptr;
 }
 
 int Menu::findItemFromWidget(const Glob* widget) const {
   if (!widget) return -1;
-  for (size_t i = 0; i < widgets_.size(); ++i) {
-    if (widgets_[i].get() == widget) return static_cast<int>(i);
+  for (const auto& [i, g] : widgets_) {
+    if (g.get() == widget) return i;
   }
   return -1;
 }

@@ -85,6 +85,8 @@ class Menu : public Glob, public ListViewWidget {
 
   Menu(const MenuData& data, Glob* owner, int width, int height, unsigned flags);
   explicit Menu(const MenuData& data);
+  // The same, taking the items over rather than copying them.
+  explicit Menu(MenuData&& data);
   explicit Menu(const std::vector<MenuItem>& items);
   explicit Menu(const configb& config);
   ~Menu() override;
@@ -226,10 +228,10 @@ class Menu : public Glob, public ListViewWidget {
 
   std::vector<int> rows_;  // the item index of every non-hidden row, in order
   int iconicCount_ = 0;
-  int contentWidth_ = 0;               // measureWidth() as of the last rebuild
-  std::vector<GlobHandle<>> widgets_;  // per item: its button, if any
-  GlobHandle<> scrollBar_;             // a ScrollBar
-  GlobHandle<> dismisser_;             // a MenuDismisser
+  int contentWidth_ = 0;                               // measureWidth() as of the last rebuild
+  std::vector<std::pair<int, GlobHandle<>>> widgets_;  // iconic items' buttons, by item index
+  GlobHandle<> scrollBar_;                             // a ScrollBar
+  GlobHandle<> dismisser_;                             // a MenuDismisser
   unsigned flags_ = MenuData::kCloseOnOutsideClick | MenuData::kShowTitle;
   bool hasBaseColour_ = false;
   Colour baseColour_;

@@ -27,15 +27,23 @@ WString resourceText(unsigned int id) {
 }  // namespace
 
 Colour MenuItem::getDefaultColour() {
-  return Palette().windowShade(3);
+  static const Colour colour = Palette().windowShade(3);
+  return colour;
 }
 
-MenuItem::MenuItem() : col_(getDefaultColour()), fCol_(Palette().get(Palette::WindowText)) {
+namespace {
+const Colour& defaultTextColour() {
+  static const Colour colour = Palette().get(Palette::WindowText);
+  return colour;
+}
+}  // namespace
+
+MenuItem::MenuItem() : col_(getDefaultColour()), fCol_(defaultTextColour()) {
   takeFreshId();
 }
 
-MenuItem::MenuItem(const WString& label, const String& msg, MenuItemType type) : MenuItem() {
-  init(label, msg, type);
+MenuItem::MenuItem(WString label, const String& msg, MenuItemType type) : MenuItem() {
+  init(std::move(label), msg, type);
 }
 
 MenuItem::MenuItem(const WString& label, const String& msg, const Colour& col, MenuItemType type)
@@ -102,8 +110,8 @@ bool MenuItem::operator==(const MenuItem& o) const {
          flags_ == o.flags_ && font_ == o.font_;
 }
 
-void MenuItem::init(const WString& label, const String& msg, MenuItemType type) {
-  label_ = label;
+void MenuItem::init(WString label, const String& msg, MenuItemType type) {
+  label_ = std::move(label);
   msg_ = msg;
   type_ = type;
   options_.clear();

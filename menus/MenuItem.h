@@ -42,7 +42,7 @@ class MenuItem {
   static bool isValid(uint32_t id) { return id != 0 && id < lastID_; }
 
   MenuItem();
-  MenuItem(const WString& label, const String& msg, MenuItemType type = SimpleMenuItem);
+  MenuItem(WString label, const String& msg, MenuItemType type = SimpleMenuItem);
   MenuItem(const WString& label, const String& msg, const Colour& col,
            MenuItemType type = SimpleMenuItem);
   MenuItem(const WString& label, const String& msg, const Colour& col, const Colour& fCol,
@@ -65,7 +65,7 @@ class MenuItem {
   bool operator==(const MenuItem& other) const;
 
   // Sets the label (parsing its options for types 0 and 1) and the type, and takes a fresh id.
-  void init(const WString& label, const String& msg, MenuItemType type);
+  void init(WString label, const String& msg, MenuItemType type);
 
   // --- Fields ---
   MenuItemType type() const { return type_; }
