@@ -6,6 +6,7 @@
 
 #include "buttons/Button.h"
 #include "buttons/PinButton.h"
+#include "menus/Menu.h"
 #include "panels/ModalShade.h"
 #include "panels/PanelStandardWidgets.h"
 #include "platform/glib/look/PanelLook.h"
@@ -525,7 +526,10 @@ int StandardPanel::reactToMessage(Event* e) {
     if (self) handleTitleChange();
     return 1;
   }
-  if (msg == "screwdriver") return rect::react(e);
+  // The menu base's own messages: the pop-up's report of a choice and of its closing.
+  if (msg == "screwdriver" || msg == Menu::pootMsg_ || msg == Menu::itemSelectedMsg_) {
+    return rect::react(e);
+  }
   const int handled = handleMessageEvent(msg, event_to_sender_glob(e));
   if (handled) return handled;
   return self ? rect::react(e) : 1;

@@ -108,6 +108,8 @@ class TextBox : public TextBoxBase {
   void setMargins(unsigned char left, unsigned char right);
   void setObfuscatedDisplay(bool on);
   bool isObfuscatedDisplay() const { return obfuscated_; }
+  // Hidden text never goes to the clipboard.
+  bool canCopyText() const override { return !obfuscated_ && !isEmpty(); }
   // Where the text starts (alignment), and how far it is scrolled left, in pixels.
   int textX() const { return textX_; }
   int scrollOffset() const { return scrollOffset_; }

@@ -288,6 +288,15 @@ bool TextBoxBase::reviewMenu(Event*) {
   return isActive();
 }
 
+bool TextBoxBase::openEditMenu(XY<int>) {
+  const bool editable = editable_ && isActive();
+  clearMenu();
+  addMenuItem(L"Cut", cutMsg, editable && !isEmpty());
+  addMenuItem(L"Copy", copyMsg, canCopyText());
+  addMenuItem(L"Paste", pasteMsg, editable && WindowsClipboard::hasText());
+  return makeMenu(nullptr, true) != nullptr;
+}
+
 void TextBoxBase::addUndoItem(const HistoryItem& item) {
   model_.addUndoItem(item);
 }

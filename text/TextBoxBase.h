@@ -26,8 +26,11 @@
 //   everything (`highlightAllText(true)`).
 // - The context menu offers "Cut", "Copy" and "Paste" by message: reviewMenu agrees to show a
 //   menu for an active box. A right-button press on an active box, editable or not, calls
-//   `openEditMenu` with the press position in the box; the base shows nothing and returns
-//   false, so the press travels on to the owner until the menu code fills the hook.
+//   `openEditMenu` with the press position in the box, which opens the pop-up at the pointer.
+//   An entry is inactive when it cannot apply: Cut and Paste in a read-only box, Cut and Copy
+//   with no text (with no selection they take the whole text, as the shortcuts do), Copy when
+//   canCopyText says no, Paste with an empty clipboard. Chosen entries come back as the
+//   messages the box handles.
 #include <cstdint>
 #include <vector>
 
@@ -146,8 +149,10 @@ class TextBoxBase : public StandardPanel, public GlobTabStop {
   // The font of the text (a new virtual of the text boxes).
   virtual void setFont(const Glib::FontDesc& font);
   // Offers Cut, Copy and Paste at `pos` (the box's coordinates) after a right-button press;
-  // true when a menu showed, which consumes the press. The base has no menu yet.
-  virtual bool openEditMenu(XY<int> pos) { return false; }
+  // true when a menu showed, which consumes the press.
+  virtual bool openEditMenu(XY<int> pos);
+  // Whether the box's text may go to the clipboard.
+  virtual bool canCopyText() const { return !isEmpty(); }
 
   // --- Glob ---
   int react(Event* e) override;
