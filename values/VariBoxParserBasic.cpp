@@ -15,35 +15,25 @@ template <typename T>
 VariBoxParserBasic<T>::VariBoxParserBasic(VariBox* owner,
                                           VariBoxParserBasicDisplayerBase<T>* displayer, T min,
                                           T max, T minorStep, T majorStep, T value, T scale)
-    : VariBoxParserBase(owner),
+    : VariBoxParserTyped<T>(owner, min, max, value, scale),
       displayer(displayer),
-      min(orIfNaN(min, ParserArithmetic<T>::lowest())),
-      max(orIfNaN(max, ParserArithmetic<T>::largest())),
       minorStep(orIfNaN(minorStep, T{})),
-      majorStep(orIfNaN(majorStep, T{})),
-      value(orIfNaN(value, this->min)),
-      scale(scale),
-      scaled(scale > 0) {}
+      majorStep(orIfNaN(majorStep, T{})) {}
 
 template <typename T>
 VariBoxParserBasic<T>::VariBoxParserBasic(const VariBoxParserBasic& other)
-    : ValWidget<T>(), VariBoxParserBase(other) {
-  *this = other;
-}
+    : VariBoxParserTyped<T>(other),
+      displayer(other.displayer),
+      minorStep(other.minorStep),
+      majorStep(other.majorStep) {}
 
 template <typename T>
 VariBoxParserBasic<T>& VariBoxParserBasic<T>::operator=(const VariBoxParserBasic& other) {
   if (this == &other) return *this;
-  VariBoxParserBase::operator=(other);
-  this->setAdaptor(other.getAdaptor());
+  VariBoxParserTyped<T>::operator=(other);
   displayer = other.displayer;
-  min = other.min;
-  max = other.max;
   minorStep = other.minorStep;
   majorStep = other.majorStep;
-  value = other.value;
-  scale = other.scale;
-  scaled = other.scaled;
   return *this;
 }
 
@@ -54,27 +44,6 @@ void VariBoxParserBasic<T>::init() {
     if (const unsigned char n = displayer->getMaxNumChars()) setMaxNumChars(n);
   }
   if (setValueInternal(value, 1)) notifyValidatedTextChange(false);
-}
-
-template <typename T>
-bool VariBoxParserBasic<T>::setValueInternal(T v, int flags) {
-  using A = ParserArithmetic<T>;
-  if (!A::isNaN(v)) v = A::clamp(v, min, max);
-  if (!A::isNaN(v) && !(v == value)) {
-    value = v;
-    text = valueToString(scaled ? A::scaleUp(v, scale) : v);
-    // The model may delete the box, and this parser with it: nothing is touched afterwards.
-    if (flags & 2) this->requestSetNewDataValue(v, getDataChangeType());
-    return true;
-  }
-  if (flags & 1) {
-    WString refreshed = valueToString(scaled ? A::scaleUp(value, scale) : value);
-    if (refreshed != text) {
-      text = std::move(refreshed);
-      return true;
-    }
-  }
-  return false;
 }
 
 template <typename T>
@@ -90,11 +59,6 @@ bool VariBoxParserBasic<T>::decInternal(T step) {
 }
 
 template <typename T>
-bool VariBoxParserBasic<T>::handleNoChange() {
-  return this->requestSetNewDataValue(value, getDataChangeType());
-}
-
-template <typename T>
 bool VariBoxParserBasic<T>::handleParseText() {
   T parsed = displayer ? displayer->parse(text) : value;
   if (displayer && scaled) parsed = ParserArithmetic<T>::scaleDown(parsed, scale);
@@ -107,20 +71,7 @@ double VariBoxParserBasic<T>::getPositionWithinRange() {
 }
 
 template <typename T>
-void VariBoxParserBasic<T>::setNewWidgetValue(T& v) {
-  if (setValueInternal(v, 0)) notifyValidatedTextChange(false);
-}
-
-template <typename T>
-bool VariBoxParserBasic<T>::setValue(T v) {
-  const PublishGuard guard(this);
-  const bool changed = setValueInternal(v, 2);
-  if (changed && guard.parserAlive()) notifyValidatedTextChange(false);
-  return changed;
-}
-
-template <typename T>
-WString VariBoxParserBasic<T>::valueToString(T v) {
+WString VariBoxParserBasic<T>::valueToString(T v) const {
   return displayer ? displayer->format(v) : WString();
 }
 

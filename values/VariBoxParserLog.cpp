@@ -9,11 +9,6 @@
 
 namespace {
 
-template <typename T>
-T orIfNaN(T v, T fallback) {
-  return ParserArithmetic<T>::isNaN(v) ? fallback : v;
-}
-
 double stepOrZero(double step) {
   return step == step ? step : 0.0;
 }
@@ -24,14 +19,9 @@ template <typename T>
 VariBoxParserLog<T>::VariBoxParserLog(VariBox* owner, T min, T max, double minorStep,
                                       double majorStep, T value, T scale, unsigned char maxNumChars,
                                       int formatFlags, int64_t width, int64_t precision)
-    : VariBoxParserBase(owner),
-      min(orIfNaN(min, ParserArithmetic<T>::lowest())),
-      max(orIfNaN(max, ParserArithmetic<T>::largest())),
+    : VariBoxParserTyped<T>(owner, min, max, value, scale),
       minorStep(stepOrZero(minorStep)),
       majorStep(stepOrZero(majorStep)),
-      value(orIfNaN(value, this->min)),
-      scale(scale),
-      scaled(scale > 0),
       formatFlags(formatFlags),
       width(width),
       precision(precision),
@@ -39,22 +29,20 @@ VariBoxParserLog<T>::VariBoxParserLog(VariBox* owner, T min, T max, double minor
 
 template <typename T>
 VariBoxParserLog<T>::VariBoxParserLog(const VariBoxParserLog& other)
-    : ValWidget<T>(), VariBoxParserBase(other) {
-  *this = other;
-}
+    : VariBoxParserTyped<T>(other),
+      minorStep(other.minorStep),
+      majorStep(other.majorStep),
+      formatFlags(other.formatFlags),
+      width(other.width),
+      precision(other.precision),
+      maxNumChars(other.maxNumChars) {}
 
 template <typename T>
 VariBoxParserLog<T>& VariBoxParserLog<T>::operator=(const VariBoxParserLog& other) {
   if (this == &other) return *this;
-  VariBoxParserBase::operator=(other);
-  this->setAdaptor(other.getAdaptor());
-  min = other.min;
-  max = other.max;
+  VariBoxParserTyped<T>::operator=(other);
   minorStep = other.minorStep;
   majorStep = other.majorStep;
-  value = other.value;
-  scale = other.scale;
-  scaled = other.scaled;
   formatFlags = other.formatFlags;
   width = other.width;
   precision = other.precision;
@@ -89,27 +77,6 @@ void VariBoxParserLog<T>::init() {
 }
 
 template <typename T>
-bool VariBoxParserLog<T>::setValueInternal(T v, int flags) {
-  using A = ParserArithmetic<T>;
-  if (!A::isNaN(v)) v = A::clamp(v, min, max);
-  if (!A::isNaN(v) && !(v == value)) {
-    value = v;
-    text = valueToString(scaled ? A::scaleUp(v, scale) : v);
-    // The model may delete the box, and this parser with it: nothing is touched afterwards.
-    if (flags & 2) this->requestSetNewDataValue(v, getDataChangeType());
-    return true;
-  }
-  if (flags & 1) {
-    WString refreshed = valueToString(scaled ? A::scaleUp(value, scale) : value);
-    if (refreshed != text) {
-      text = std::move(refreshed);
-      return true;
-    }
-  }
-  return false;
-}
-
-template <typename T>
 double VariBoxParserLog<T>::getPositionWithinRange() {
   return ParserArithmetic<T>::logPosition(value, min, max);
 }
@@ -132,11 +99,6 @@ bool VariBoxParserLog<T>::decInternal(double step) {
 }
 
 template <typename T>
-bool VariBoxParserLog<T>::handleNoChange() {
-  return this->requestSetNewDataValue(value, getDataChangeType());
-}
-
-template <typename T>
 bool VariBoxParserLog<T>::handleParseText() {
   std::wistringstream in(text);
   T parsed{};
@@ -144,19 +106,6 @@ bool VariBoxParserLog<T>::handleParseText() {
   if (in.fail()) return setValueInternal(value, 1);
   if (scaled) parsed = ParserArithmetic<T>::scaleDown(parsed, scale);
   return setValueInternal(parsed, 3);
-}
-
-template <typename T>
-void VariBoxParserLog<T>::setNewWidgetValue(T& v) {
-  if (setValueInternal(v, 0)) notifyValidatedTextChange(false);
-}
-
-template <typename T>
-bool VariBoxParserLog<T>::setValue(T v) {
-  const PublishGuard guard(this);
-  const bool changed = setValueInternal(v, 2);
-  if (changed && guard.parserAlive()) notifyValidatedTextChange(false);
-  return changed;
 }
 
 template <typename T>

@@ -25,11 +25,10 @@
 // - Widths and precisions above kMaxField are taken as kMaxField.
 #include <cstdint>
 
-#include "foundation/ValWidget.h"
-#include "values/VariBoxParserBase.h"
+#include "values/VariBoxParserTyped.h"
 
 template <typename T>
-class VariBoxParserLog : public ValWidget<T>, public VariBoxParserBase {
+class VariBoxParserLog : public VariBoxParserTyped<T> {
  public:
   static constexpr int64_t kMaxField = 255;
 
@@ -46,36 +45,32 @@ class VariBoxParserLog : public ValWidget<T>, public VariBoxParserBase {
   bool handleMinorInc() override { return incInternal(minorStep); }
   bool handleMajorDec() override { return decInternal(majorStep); }
   bool handleMinorDec() override { return decInternal(minorStep); }
-  bool handleNoChange() override;
   bool handleParseText() override;
   double getPositionWithinRange() override;
 
-  // --- ValWidget<T> ---
-  T getWidgetValue() override { return value; }
-  void setNewWidgetValue(T& v) override;
-  void setEnabledState(bool enabled) override { setEnabled(enabled); }
-
-  bool setValue(T v);
-  T getValue() const { return value; }
-  T getMin() const { return min; }
-  T getMax() const { return max; }
   // The characters that init offers the box, for this range, type and display base.
   String allowedCharacters() const;
 
  private:
-  bool setValueInternal(T v, int flags);
+  using VariBoxParserTyped<T>::min;
+  using VariBoxParserTyped<T>::max;
+  using VariBoxParserTyped<T>::value;
+  using VariBoxParserTyped<T>::scale;
+  using VariBoxParserTyped<T>::scaled;
+  using VariBoxParserTyped<T>::text;
+  using VariBoxParserTyped<T>::setValueInternal;
+  using VariBoxParserTyped<T>::setAllowedCharacters;
+  using VariBoxParserTyped<T>::setMaxNumChars;
+  using VariBoxParserTyped<T>::notifyValidatedTextChange;
+  using VariBoxParserTyped<T>::getDataChangeType;
+
   bool incInternal(double step);
   bool decInternal(double step);
   bool setPositionWithinRange(double p);
-  WString valueToString(T v) const;
+  WString valueToString(T v) const override;
 
-  T min;
-  T max;
   double minorStep;
   double majorStep;
-  T value;
-  T scale;
-  bool scaled;
   int formatFlags;
   int64_t width;
   int64_t precision;
