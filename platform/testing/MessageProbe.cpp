@@ -9,8 +9,14 @@ int MessageProbe::react(Event* e) {
   m.sender = event_to_sender_glob(e);
   m.senderKind = m.sender ? m.sender->idstring() : "";
   m.modifiers = e->word2;
+  const int answer = answer_;
+  const bool act = action && m.text == trigger;
   messages_.push_back(std::move(m));
-  return answer_;
+  if (act) {
+    const std::function<void()> run = action;  // the action may delete this probe
+    run();
+  }
+  return answer;
 }
 
 std::vector<String> MessageProbe::texts() const {

@@ -1,6 +1,7 @@
 #pragma once
 // A Glob that records every message event it receives: make it the parent of the controls
 // under test and look at what they reported.
+#include <functional>
 #include <vector>
 
 #include "platform/glob/Glob.h"
@@ -28,6 +29,11 @@ class MessageProbe : public Glob {
   void clear() { messages_.clear(); }
   // The value react returns for messages (1 consumes them).
   void setAnswer(int answer) { answer_ = answer; }
+
+  // Run after a message whose text is `trigger` has been recorded: the test's answer to it
+  // (setting the sender's state, deleting it...). The action may delete this probe too.
+  String trigger;
+  std::function<void()> action;
 
  private:
   std::vector<ReceivedMessage> messages_;

@@ -15,19 +15,6 @@ namespace {
 
 using Texts = std::vector<String>;
 
-// A parent that can run an action when a given message arrives (to delete its child, say).
-class ActingParent : public MessageProbe {
- public:
-  using MessageProbe::MessageProbe;
-  int react(Event* e) override {
-    const int r = MessageProbe::react(e);
-    if (message_event(e) && e->text() == trigger && action) action();
-    return r;
-  }
-  String trigger;
-  std::function<void()> action;
-};
-
 class CountingAdaptor : public ButtonAdaptor<WString> {
  public:
   explicit CountingAdaptor(std::function<void()> onClick = {}) : onClick_(std::move(onClick)) {}
@@ -53,7 +40,7 @@ struct ButtonTest : ::testing::Test {
   XY<int> centre(const Glob& g) { return Harness::centreOf(g); }
 
   Harness h;
-  ActingParent parent{h.place(0, 0, 300, 200)};
+  MessageProbe parent{h.place(0, 0, 300, 200)};
 };
 
 }  // namespace

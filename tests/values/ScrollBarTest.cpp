@@ -14,19 +14,6 @@ namespace {
 
 using Texts = std::vector<String>;
 
-// A parent that answers a given message with an action (setting the thumb, deleting the bar).
-class AnsweringParent : public MessageProbe {
- public:
-  using MessageProbe::MessageProbe;
-  int react(Event* e) override {
-    const int r = MessageProbe::react(e);
-    if (message_event(e) && e->text() == trigger && action) action();
-    return r;
-  }
-  String trigger;
-  std::function<void()> action;
-};
-
 // A horizontal bar 232 long at (20, 20): its trough runs from x 16 to 216 of the bar, 200
 // pixels, so a thumb of size s at position p covers 16 + 200 p to 16 + 200 (p + s).
 struct ScrollBarTest : ::testing::Test {
@@ -47,7 +34,7 @@ struct ScrollBarTest : ::testing::Test {
   }
 
   Harness h;
-  AnsweringParent parent{h.place(0, 0, 400, 300)};
+  MessageProbe parent{h.place(0, 0, 400, 300)};
 };
 
 }  // namespace

@@ -16,19 +16,6 @@ namespace {
 
 using Texts = std::vector<String>;
 
-// A parent that runs an action when a given message arrives (deleting its child, say).
-class ActingParent : public MessageProbe {
- public:
-  using MessageProbe::MessageProbe;
-  int react(Event* e) override {
-    const int r = MessageProbe::react(e);
-    if (message_event(e) && e->text() == trigger && action) action();
-    return r;
-  }
-  String trigger;
-  std::function<void()> action;
-};
-
 // Records every value a control asks for, with its change type, and accepts it.
 class RecordingAdaptor : public ValAdaptorBase<double> {
  public:
@@ -54,7 +41,7 @@ struct SliderTest : ::testing::Test {
   XY<int> at(int alongPixel, int y = 15) const { return XY<int>(10 + alongPixel, y); }
 
   Harness h;
-  ActingParent parent{h.place(0, 0, 300, 200)};
+  MessageProbe parent{h.place(0, 0, 300, 200)};
   Slider* slider = nullptr;
   Kw::Ptr<RecordingAdaptor> adaptor = Kw::Ptr<RecordingAdaptor>(new RecordingAdaptor);
 };
