@@ -6,25 +6,12 @@
 #include "gallery/MessageLog.h"
 #include "platform/glob/KeyCodes.h"
 #include "platform/testing/Harness.h"
+#include "tests/gallery/GalleryTestSupport.h"
 #include "text/InputBox.h"
 #include "text/KwToolTip.h"
 #include "text/TextLabel.h"
 
 namespace {
-
-Glob* findNamed(Glob& under, const String& name) {
-  for (Glob* g : under.children()) {
-    if (g->get_name() == name) return g;
-    if (Glob* found = findNamed(*g, name)) return found;
-  }
-  return nullptr;
-}
-
-int pageTitled(const GalleryApp& app, const String& title) {
-  for (int i = 0; i < app.pageCount(); ++i)
-    if (app.pageTitle(i) == title) return i;
-  return -1;
-}
 
 struct GalleryFixture : ::testing::Test {
   void TearDown() override {

@@ -10,22 +10,13 @@
 #include "panels/MinimizableGroup.h"
 #include "panels/TabStrip.h"
 #include "platform/testing/Harness.h"
+#include "tests/gallery/GalleryTestSupport.h"
 
 namespace {
 
-Glob* findNamed(Glob& under, const String& name) {
-  for (Glob* g : under.children()) {
-    if (g->get_name() == name) return g;
-    if (Glob* found = findNamed(*g, name)) return found;
-  }
-  return nullptr;
-}
-
 struct GroupsPageFixture : ::testing::Test {
   void SetUp() override {
-    for (int i = 0; i < app->pageCount(); ++i) {
-      if (app->pageTitle(i) == "Groups") app->selectPage(i);
-    }
+    app->selectPage(pageTitled(*app, "Groups"));
     page = app->page(app->currentPage());
     ASSERT_TRUE(page && page->title() == "Groups");
   }

@@ -8,25 +8,16 @@
 #include "gallery/MessageLog.h"
 #include "platform/glob/KeyCodes.h"
 #include "platform/testing/Harness.h"
+#include "tests/gallery/GalleryTestSupport.h"
 #include "values/Slider.h"
 #include "values/VariBox.h"
 #include "values/VariFriendlyTextBox.h"
 
 namespace {
 
-Glob* findNamed(Glob& under, const String& name) {
-  for (Glob* g : under.children()) {
-    if (g->get_name() == name) return g;
-    if (Glob* found = findNamed(*g, name)) return found;
-  }
-  return nullptr;
-}
-
 struct TrimFixture : ::testing::Test {
   void SetUp() override {
-    for (int i = 0; i < app->pageCount(); ++i) {
-      if (app->pageTitle(i) == "Sliders & scroll bars") app->selectPage(i);
-    }
+    app->selectPage(pageTitled(*app, "Sliders & scroll bars"));
     GalleryPage* page = app->page(app->currentPage());
     ASSERT_TRUE(page);
     slider = dynamic_cast<Slider*>(findNamed(*page, "trim slider"));
