@@ -443,11 +443,11 @@ int DataTable::handleMessage(Event* e) {
     }
     return 1;
   }
-  if (sender && editor_.refersTo(static_cast<CellEditor*>(sender))) {
+  if (sender && editor_.refersTo(dynamic_cast<CellEditor*>(sender))) {
     endEdit(m == CellEditor::commitMsg);
     return 1;
   }
-  if (sender && chooser_.refersTo(static_cast<ChoiceList*>(sender))) {
+  if (sender && chooser_.refersTo(dynamic_cast<ChoiceList*>(sender))) {
     const XY<int> cell = editCell_;
     endEdit(false);
     if (m == ChoiceList::pickedMsg) store(cell, e->payload());

@@ -285,20 +285,23 @@ TEST_F(ScrollBarTest, AParentDeletingTheBarDuringAReportIsSafe) {
   ScrollBar* d = make(kHorizontal, 0.0, 0.2);
   handle = GlobHandle<ScrollBar>(d);
   parent.trigger = ScrollBar::thumbMovedMsg;
-  h.press(on(*d, 26));
-  h.move(on(*d, 60));
+  // Positions are worked out while the bar still exists.
+  const XY<int> grip = on(*d, 26), mid = on(*d, 60), end = on(*d, 80);
+  h.press(grip);
+  h.move(mid);
   EXPECT_FALSE(handle.alive());
-  h.move(on(*d, 80));
-  h.release(on(*d, 80));
+  h.move(end);
+  h.release(end);
 
   ScrollBar* e = make(kHorizontal, 0.0, 0.1);
   handle = GlobHandle<ScrollBar>(e);
   parent.action = {};
-  h.press(on(*e, 206));
+  const XY<int> trough = on(*e, 206);
+  h.press(trough);
   parent.action = [&handle] { delete handle.get(); };
   h.advance(400);
   EXPECT_FALSE(handle.alive());
-  h.release(on(*e, 206));
+  h.release(trough);
 }
 
 TEST_F(ScrollBarTest, WholeThumbOrInactiveBarTakesNoPress) {
