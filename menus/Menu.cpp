@@ -14,7 +14,6 @@
 #include "platform/glob/RootGlob.h"
 #include "platform/glob/WindowPlacement.h"
 #include "platform/misc/Config.h"
-#include "platform/misc/EditorPreferences.h"
 #include "platform/os/OS.h"
 #include "values/ScrollBar.h"
 
@@ -237,47 +236,6 @@ void Menu::setOwner(Glob* owner) {
 void Menu::setMaxVisibleRows(int rows) {
   maxVisibleRows_ = rows < 0 ? -1 : rows;
   relayout();
-}
-
-// --- Group states ---
-
-String Menu::groupPreferenceName(const String& key, const WString& header) {
-  return "Menu (" + key + ") : " + Kw::toUtf8(header);
-}
-
-void Menu::saveGroupStates(const String& key) const {
-  if (key.empty()) return;
-  for (const MenuItem& it : items_) {
-    if (!it.isGroupHeader()) continue;
-    prefs().setPreference(groupPreferenceName(key, it.getDisplayString()),
-                          menuItemTypeName(it.type()));
-  }
-}
-
-void Menu::restoreGroupStates(const String& key) {
-  if (key.empty()) return;
-  for (MenuItem& it : items_) {
-    if (!it.isGroupHeader()) continue;
-    const String name = groupPreferenceName(key, it.getDisplayString());
-    if (!prefs().hasPreference(name)) continue;
-    MenuItemType t = it.type();
-    // Only a header state is taken: a stored value naming anything else leaves the header.
-    if (menuItemTypeFromName(prefs().getPreference(name), t) &&
-        (t == ExpandedGroupItem || t == CompressedGroupItem)) {
-      it.type(t);
-    }
-  }
-  ensureAtLeastOneExpandedGroup();
-  rebuild();
-}
-
-void Menu::ensureAtLeastOneExpandedGroup() {
-  int lastCompressed = -1;
-  for (size_t i = 0; i < items_.size(); ++i) {
-    if (items_[i].type() == ExpandedGroupItem) return;
-    if (items_[i].type() == CompressedGroupItem) lastCompressed = static_cast<int>(i);
-  }
-  if (lastCompressed >= 0) items_[lastCompressed].type(ExpandedGroupItem);
 }
 
 // --- Rows and geometry ---
@@ -748,86 +706,4 @@ void Menu::removeItemText(unsigned) {
 
 void Menu::itemChanged(unsigned) {
   update();
-}
-
-// --- Drawing ---
-
-Glib::FontPtr Menu::fontFor(const MenuItem& item) const {
-  if (item.getFont() == Glib::FontDesc()) return font_;
-  return Glib::fonts().get(item.getFont());
-}
-
-void Menu::draw() {
-  Glib::Painter p(*canvas());
-  if (!p.active()) return;
-  drawBackground(p);
-  p.pushClip(Kw::Box<int>(0, 0, rowsRight(), rowsTop()));
-  for (const VisibleMenuItem& row : visible_) drawMenuItem(p, row);
-  p.popClip();
-  Glib::MenuLook(getPalette()).frame(p);
-}
-
-void Menu::drawBackground(Glib::Painter& p) {
-  const Glib::MenuLook look(getPalette());
-  look.background(p, p.bounds(), hasBaseColour_ ? baseColour_ : look.face());
-  const int top = rowsTop();
-  if (titleMode_ == kTitleMode) {
-    look.titleStrip(p, Kw::Box<int>(0, height() - kTitleStripHeight, width(), height()), title_,
-                    titleColour_, *font_);
-  }
-  if (iconicCount_ > 0) look.iconStrip(p, Kw::Box<int>(0, top, width(), top + kIconStripHeight));
-}
-
-void Menu::drawMenuItem(Glib::Painter& p, int index) {
-  for (const VisibleMenuItem& row : visible_) {
-    if (row.index == index) drawMenuItem(p, row);
-  }
-}
-
-void Menu::drawMenuItem(Glib::Painter& p, const VisibleMenuItem& row) {
-  const MenuItem& it = items_[row.index];
-  const Glib::MenuLook look(getPalette());
-  const bool lit = row.index == highlighted_;
-  look.row(p, row.area, getItemBackCol(row.index), it.isGroupHeader(), lit);
-  if (it.isGroupHeader()) {
-    look.groupGlyph(p, row.area, it.type() == ExpandedGroupItem,
-                    look.rowText(it.fCol(), lit, true));
-  }
-  drawMenuItemText(p, row);
-  drawRightAlignedText(p, row);
-}
-
-void Menu::drawMenuItemText(Glib::Painter& p, const VisibleMenuItem& row) {
-  const MenuItem& it = items_[row.index];
-  const Glib::MenuLook look(getPalette());
-  const bool lit = row.index == highlighted_;
-  const Colour c = look.rowText(it.fCol(), lit, it.getActive() || it.isGroupHeader());
-  const Kw::Box<int> box(row.area.x0 + kGlyphColumn, row.area.y0, row.area.x1 - kRightMargin,
-                         row.area.y1);
-  p.text(it.getDisplayString(), box, *fontFor(it), c, alignment_, getTextStyle(row.index));
-}
-
-void Menu::drawRightAlignedText(Glib::Painter& p, const VisibleMenuItem& row) {
-  const MenuItem& it = items_[row.index];
-  const bool choice = !it.options().empty();
-  const WString text = choice ? it.getCurOptionStr() : it.getRightAlignedText();
-  if (text.empty()) return;
-  const Glib::MenuLook look(getPalette());
-  const bool lit = row.index == highlighted_;
-  const Colour c = look.rowText(it.fCol(), lit, it.getActive());
-  Kw::Box<int> box(row.area.x0 + kGlyphColumn, row.area.y0, row.area.x1 - kRightMargin,
-                   row.area.y1);
-  if (choice) {
-    look.choiceMark(p, box, c);
-    box.x1 -= kChoiceMarkRoom;
-  }
-  p.text(text, box, *fontFor(it), c, TextAlignment::Right, getTextStyle(row.index));
-}
-
-Glib::TextStyles::TextStyle Menu::getTextStyle(int) const {
-  return Glib::TextStyles::Normal;
-}
-
-Colour Menu::getItemBackCol(int index) const {
-  return items_[index].col();
 }
