@@ -34,7 +34,8 @@ class ParserArithmetic {
     } else {
       return false;
     }
-  }
+  }  // `v`, or `fallback` when v is NaN.
+  static T orIfNaN(T v, T fallback) { return isNaN(v) ? fallback : v; }
 
   // v limited to max, then to min: when min exceeds max, min wins.
   static T clamp(T v, T min, T max) {

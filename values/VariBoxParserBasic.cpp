@@ -2,23 +2,14 @@
 
 #include "values/ParserArithmetic.h"
 
-namespace {
-
-template <typename T>
-T orIfNaN(T v, T fallback) {
-  return ParserArithmetic<T>::isNaN(v) ? fallback : v;
-}
-
-}  // namespace
-
 template <typename T>
 VariBoxParserBasic<T>::VariBoxParserBasic(VariBox* owner,
                                           VariBoxParserBasicDisplayerBase<T>* displayer, T min,
                                           T max, T minorStep, T majorStep, T value, T scale)
     : VariBoxParserTyped<T>(owner, min, max, value, scale),
       displayer(displayer),
-      minorStep(orIfNaN(minorStep, T{})),
-      majorStep(orIfNaN(majorStep, T{})) {}
+      minorStep(ParserArithmetic<T>::orIfNaN(minorStep, T{})),
+      majorStep(ParserArithmetic<T>::orIfNaN(majorStep, T{})) {}
 
 template <typename T>
 VariBoxParserBasic<T>::VariBoxParserBasic(const VariBoxParserBasic& other)

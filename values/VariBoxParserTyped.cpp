@@ -2,21 +2,12 @@
 
 #include "values/ParserArithmetic.h"
 
-namespace {
-
-template <typename T>
-T orIfNaN(T v, T fallback) {
-  return ParserArithmetic<T>::isNaN(v) ? fallback : v;
-}
-
-}  // namespace
-
 template <typename T>
 VariBoxParserTyped<T>::VariBoxParserTyped(VariBox* owner, T min, T max, T value, T scale)
     : VariBoxParserBase(owner),
-      min(orIfNaN(min, ParserArithmetic<T>::lowest())),
-      max(orIfNaN(max, ParserArithmetic<T>::largest())),
-      value(orIfNaN(value, this->min)),
+      min(ParserArithmetic<T>::orIfNaN(min, ParserArithmetic<T>::lowest())),
+      max(ParserArithmetic<T>::orIfNaN(max, ParserArithmetic<T>::largest())),
+      value(ParserArithmetic<T>::orIfNaN(value, this->min)),
       scale(scale),
       scaled(scale > 0) {}
 
