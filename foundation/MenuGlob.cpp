@@ -25,6 +25,16 @@ MenuGlob::MenuGlob(unsigned short width, unsigned short height, const Palette& p
 MenuGlob::MenuGlob(const configb&, unsigned short width, unsigned short height)
     : Glob(GlobCreationInfo(width, height, nullptr)) {}
 
+MenuGlob::MenuState& MenuGlob::menuState() {
+  if (!menuState_) menuState_ = std::make_unique<MenuState>();
+  return *menuState_;
+}
+
+const MenuGlob::MenuState& MenuGlob::menuState() const {
+  static const MenuState kNone;
+  return menuState_ ? *menuState_ : kNone;
+}
+
 MenuGlob::~MenuGlob() {
   removeMenu();
 }
@@ -32,12 +42,12 @@ MenuGlob::~MenuGlob() {
 // --- Settings ---
 
 void MenuGlob::setMenuBaseCol(const Colour& c) {
-  hasMenuBaseCol = true;
-  menuBaseCol = c;
+  menuState().hasMenuBaseCol = true;
+  menuState().menuBaseCol = c;
 }
 
 Colour MenuGlob::getMenuBaseCol() const {
-  return hasMenuBaseCol ? menuBaseCol : Glib::MenuLook(getPalette()).face();
+  return menuState().hasMenuBaseCol ? menuState().menuBaseCol : Glib::MenuLook(getPalette()).face();
 }
 
 Colour MenuGlob::getMenuItemCol() const {
@@ -49,18 +59,18 @@ Colour MenuGlob::getMenuTextCol() const {
 }
 
 void MenuGlob::setMenuTitle(unsigned int resourceId) {
-  menuTitle = UIString(resourceId).toWString();
+  menuState().menuTitle = UIString(resourceId).toWString();
 }
 
 void MenuGlob::setDefaultGroupState(MenuGroupState s) {
   // The default cannot be "the default".
-  if (s == GroupExpanded || s == GroupCompressed) defaultGroupState = s;
+  if (s == GroupExpanded || s == GroupCompressed) menuState().defaultGroupState = s;
 }
 
 // --- Building ---
 
 void MenuGlob::itemsChanged() {
-  itemsChanged_ = true;
+  menuState().itemsChanged = true;
 }
 
 MenuItem MenuGlob::newItem(const WString& label, const String& msg, MenuItemType type) const {
@@ -68,10 +78,10 @@ MenuItem MenuGlob::newItem(const WString& label, const String& msg, MenuItemType
 }
 
 uint32_t MenuGlob::addMenuItem(const WString& label, const String& msg, bool active) {
-  MenuItem item = newItem(label, msg, inGroup ? GroupedMenuItem : SimpleMenuItem);
+  MenuItem item = newItem(label, msg, menuState().inGroup ? GroupedMenuItem : SimpleMenuItem);
   item.setActive(active);
-  items.push_back(item);
-  items.back().id(item.id());
+  menuState().items.push_back(item);
+  menuState().items.back().id(item.id());
   itemsChanged();
   return item.id();
 }
@@ -81,9 +91,9 @@ uint32_t MenuGlob::addMenuItem(unsigned int resourceId, const String& msg, bool 
 }
 
 uint32_t MenuGlob::addMenuItem(const MenuItem& item) {
-  items.push_back(item);
-  MenuItem& stored = items.back();
-  if (inGroup && stored.type() == SimpleMenuItem) stored.type(GroupedMenuItem);
+  menuState().items.push_back(item);
+  MenuItem& stored = menuState().items.back();
+  if (menuState().inGroup && stored.type() == SimpleMenuItem) stored.type(GroupedMenuItem);
   itemsChanged();
   return stored.id();
 }
@@ -91,22 +101,22 @@ uint32_t MenuGlob::addMenuItem(const MenuItem& item) {
 uint32_t MenuGlob::addIconicMenuItem(const WString& image, const WString& pressedImage,
                                      const String& msg) {
   MenuItem item = newItem(image + L"," + pressedImage, msg, IconicMenuItem);
-  items.push_back(item);
-  items.back().id(item.id());
+  menuState().items.push_back(item);
+  menuState().items.back().id(item.id());
   itemsChanged();
   return item.id();
 }
 
 uint32_t MenuGlob::startMenuGroup(const WString& label, MenuGroupState state) {
-  inGroup = false;
-  if (state == GroupDefault) state = defaultGroupState;
+  menuState().inGroup = false;
+  if (state == GroupDefault) state = menuState().defaultGroupState;
   MenuItem header =
       newItem(label, String(), state == GroupCompressed ? CompressedGroupItem : ExpandedGroupItem);
   header.setTextDisplayMode(MenuItem::kHeaderTextDisplayMode);
   header.fCol(Glib::MenuLook(getPalette()).subHeadingText());
-  items.push_back(header);
-  items.back().id(header.id());
-  inGroup = true;
+  menuState().items.push_back(header);
+  menuState().items.back().id(header.id());
+  menuState().inGroup = true;
   itemsChanged();
   return header.id();
 }
@@ -119,16 +129,16 @@ uint32_t MenuGlob::insertMenuItemAfter(const WString& label, const String& msg,
                                        const WString& after) {
   const int anchor = findMenuItem(after);
   if (anchor < 0) return 0;
-  const MenuItem& a = items[anchor];
-  const bool last = static_cast<size_t>(anchor) + 1 == items.size();
+  const MenuItem& a = menuState().items[anchor];
+  const bool last = static_cast<size_t>(anchor) + 1 == menuState().items.size();
   MenuItem item(label, msg, a.col(), a.fCol(),
                 !last && a.type() != SimpleMenuItem ? GroupedMenuItem : SimpleMenuItem);
   const uint32_t id = item.id();
   if (last) {
-    items.push_back(item);
-    items.back().id(id);
+    menuState().items.push_back(item);
+    menuState().items.back().id(id);
   } else {
-    auto it = items.insert(items.begin() + anchor + 1, item);
+    auto it = menuState().items.insert(menuState().items.begin() + anchor + 1, item);
     it->id(id);
   }
   itemsChanged();
@@ -138,13 +148,13 @@ uint32_t MenuGlob::insertMenuItemAfter(const WString& label, const String& msg,
 bool MenuGlob::removeMenuItem(const WString& label) {
   const int i = findMenuItem(label);
   if (i < 0) return false;
-  if (items[i].isGroupHeader()) {
-    for (size_t j = static_cast<size_t>(i) + 1; j < items.size(); ++j) {
-      if (items[j].type() != GroupedMenuItem) break;
-      items[j].type(SimpleMenuItem);
+  if (menuState().items[i].isGroupHeader()) {
+    for (size_t j = static_cast<size_t>(i) + 1; j < menuState().items.size(); ++j) {
+      if (menuState().items[j].type() != GroupedMenuItem) break;
+      menuState().items[j].type(SimpleMenuItem);
     }
   }
-  items.erase(items.begin() + i);
+  menuState().items.erase(menuState().items.begin() + i);
   itemsChanged();
   redisplayMenu();
   return true;
@@ -157,7 +167,7 @@ bool MenuGlob::removeMenuItem(unsigned int resourceId) {
 bool MenuGlob::changeMenuItem(const WString& oldLabel, const WString& newLabel) {
   const int i = findMenuItem(oldLabel);
   if (i < 0 || oldLabel == newLabel) return false;
-  items[i].label(newLabel);
+  menuState().items[i].label(newLabel);
   if (Menu* m = openMenu()) m->changeItem(oldLabel, newLabel);
   return true;
 }
@@ -165,15 +175,16 @@ bool MenuGlob::changeMenuItem(const WString& oldLabel, const WString& newLabel) 
 bool MenuGlob::changeMenuItemMessage(const WString& label, const String& msg) {
   const int i = findMenuItem(label);
   if (i < 0) return false;
-  items[i].msg(msg);
+  menuState().items[i].msg(msg);
   if (Menu* m = openMenu()) m->changeMessage(label, msg);
   return true;
 }
 
 bool MenuGlob::setMenuItemChoice(const WString& label, uint64_t n) {
   const int i = findMenuItem(label);
-  if (i < 0 || items[i].curOption() == n || n >= items[i].options().size()) return false;
-  items[i].setCurOption(n);
+  if (i < 0 || menuState().items[i].curOption() == n || n >= menuState().items[i].options().size())
+    return false;
+  menuState().items[i].setCurOption(n);
   if (Menu* m = openMenu()) m->setCurrentChoice(label, n);
   return true;
 }
@@ -185,8 +196,8 @@ WString MenuGlob::getMenuItemChoice(const WString& label) const {
 
 bool MenuGlob::setMenuItemActive(uint32_t id, bool active) {
   const int i = findMenuItem(id);
-  if (i < 0 || items[i].getActive() == active) return false;
-  items[i].setActive(active);
+  if (i < 0 || menuState().items[i].getActive() == active) return false;
+  menuState().items[i].setActive(active);
   itemsChanged();
   redisplayMenu();
   return true;
@@ -213,23 +224,23 @@ bool MenuGlob::toggleMenuEntry(PrefVal<bool>& flag, unsigned int resourceId) {
 }
 
 void MenuGlob::clearMenu() {
-  items.clear();
-  inGroup = false;
+  menuState().items.clear();
+  menuState().inGroup = false;
   itemsChanged();
 }
 
 int MenuGlob::findMenuItem(const WString& label) const {
-  return MenuItemList::findByDisplayString(items, label);
+  return MenuItemList::findByDisplayString(menuState().items, label);
 }
 
 int MenuGlob::findMenuItem(uint32_t id) const {
-  return MenuItemList::findById(items, id);
+  return MenuItemList::findById(menuState().items, id);
 }
 
 // --- The pop-up ---
 
 Menu* MenuGlob::openMenu() const {
-  Menu* m = menu.get();
+  Menu* m = menuState_ ? menuState_->menu.get() : nullptr;
   return m && m->m_is_type("menu") ? m : nullptr;
 }
 
@@ -241,9 +252,9 @@ Menu* MenuGlob::makeMenu(Event* e, bool movePopup) {
   RootGlob* screen = root();
   if (!screen) return nullptr;
   if (Menu* open = openMenu()) {
-    open->redisplay(items);
-    open->restoreGroupStates(menuPrefsKey);
-    itemsChanged_ = false;
+    open->redisplay(menuState().items);
+    open->restoreGroupStates(menuState().menuPrefsKey);
+    menuState().itemsChanged = false;
     if (movePopup) {
       const XY<int> p = screen->pointer();
       const Kw::Box<int> r = open->canvas()->rect();
@@ -251,34 +262,34 @@ Menu* MenuGlob::makeMenu(Event* e, bool movePopup) {
     }
     return open;
   }
-  if (items.empty()) return nullptr;
+  if (!hasMenuItems()) return nullptr;
   MenuData data;
-  data.items = items;
+  data.items = menuState().items;
   data.owner = this;
-  data.flags = (menuOptions & 1u ? MenuData::kCloseOnOutsideClick : 0u) |
-               (menuOptions & 16u ? MenuData::kShowTitle : 0u);
-  data.hasBaseColour = hasMenuBaseCol;
-  data.baseColour = menuBaseCol;
+  data.flags = (menuState().menuOptions & 1u ? MenuData::kCloseOnOutsideClick : 0u) |
+               (menuState().menuOptions & 16u ? MenuData::kShowTitle : 0u);
+  data.hasBaseColour = menuState().hasMenuBaseCol;
+  data.baseColour = menuState().menuBaseCol;
   auto* m = new Menu(std::move(data));
-  m->restoreGroupStates(menuPrefsKey);
+  m->restoreGroupStates(menuState().menuPrefsKey);
   if (!m->popUp(*screen, screen->pointer())) {
     delete m;
     return nullptr;
   }
-  menu = GlobHandle<Menu>(m);
-  itemsChanged_ = false;
+  menuState().menu = GlobHandle<Menu>(m);
+  menuState().itemsChanged = false;
   return m;
 }
 
 const std::vector<MenuItem>& MenuGlob::getMenuItems(Event* e) {
   reviewMenu(e);
-  return items;
+  return menuState().items;
 }
 
 void MenuGlob::redisplayMenu() {
   if (Menu* m = openMenu()) {
-    m->redisplay(items);
-    itemsChanged_ = false;
+    m->redisplay(menuState().items);
+    menuState().itemsChanged = false;
   }
 }
 
@@ -287,19 +298,20 @@ void MenuGlob::updateMenuIfNecessary() {
 }
 
 void MenuGlob::removeMenu() {
+  if (!menuState_) return;  // never had a menu: nothing to make just to clear it
   if (Menu* m = openMenu()) delete m;
-  menu.reset();
+  menuState_->menu.reset();
 }
 
 void MenuGlob::handleMenuClosed() {
   Menu* m = openMenu();
   if (!m) return;
-  m->saveGroupStates(menuPrefsKey);
+  m->saveGroupStates(menuState().menuPrefsKey);
   // The pop-up's list is the owner's, unless the owner changed its own since: match by display
   // string, trying the same position first.
   const std::vector<MenuItem>& shown = m->items();
-  for (size_t i = 0; i < items.size(); ++i) {
-    MenuItem& it = items[i];
+  for (size_t i = 0; i < menuState().items.size(); ++i) {
+    MenuItem& it = menuState().items[i];
     if (it.options().empty() && !it.isGroupHeader()) continue;
     const WString name = it.getDisplayString();
     int j = i < shown.size() && shown[i].getDisplayString() == name
@@ -311,7 +323,7 @@ void MenuGlob::handleMenuClosed() {
     }
     if (it.isGroupHeader() && shown[j].isGroupHeader()) it.type(shown[j].type());
   }
-  menu.reset();
+  menuState().menu.reset();
 }
 
 bool MenuGlob::handleRightPress(Event* e) {
@@ -319,7 +331,7 @@ bool MenuGlob::handleRightPress(Event* e) {
   if (std::abs(d.x) >= kClickSlop || std::abs(d.y) >= kClickSlop) return false;
   GlobHandle<MenuGlob> self(this);
   initialiseMenu();
-  if (!self || items.empty()) return false;
+  if (!self || !hasMenuItems()) return false;
   const unsigned short x = static_cast<unsigned short>(std::max(0, e->pos.x));
   const unsigned short y = static_cast<unsigned short>(std::max(0, e->pos.y));
   if (handleMenuClick(x, y) || !self) return false;

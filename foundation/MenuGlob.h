@@ -25,6 +25,7 @@
 // - Display strings are compared exactly, case included.
 // - setMenuItemChoice refuses a choice outside the item's options.
 #include <cstdint>
+#include <memory>
 #include <vector>
 
 #include "menus/MenuItem.h"
@@ -64,7 +65,7 @@ class MenuGlob : public Glob {
   // True when a right click at (x, y) of this Glob must not open the menu.
   virtual bool handleMenuClick(unsigned short x, unsigned short y) { return false; }
   // The pop-up's title; empty for none.
-  virtual WString getMenuTitle() { return menuTitle; }
+  virtual WString getMenuTitle() { return menuState().menuTitle; }
 
   // --- Settings ---
   void setMenuBaseCol(const Colour& c);
@@ -74,13 +75,13 @@ class MenuGlob : public Glob {
   Colour getMenuBaseCol() const;
   Colour getMenuItemCol() const;
   Colour getMenuTextCol() const;
-  void setMenuTitle(const WString& title) { menuTitle = title; }
+  void setMenuTitle(const WString& title) { menuState().menuTitle = title; }
   void setMenuTitle(unsigned int resourceId);
-  void setMenuPrefsKey(const String& key) { menuPrefsKey = key; }
-  const String& getMenuPrefsKey() const { return menuPrefsKey; }
+  void setMenuPrefsKey(const String& key) { menuState().menuPrefsKey = key; }
+  const String& getMenuPrefsKey() const { return menuState().menuPrefsKey; }
   void setDefaultGroupState(MenuGroupState s);
-  void setMenuOptions(unsigned options) { menuOptions = options; }
-  unsigned getMenuOptions() const { return menuOptions; }
+  void setMenuOptions(unsigned options) { menuState().menuOptions = options; }
+  unsigned getMenuOptions() const { return menuState().menuOptions; }
 
   // --- Building (ids of new items, 0 when nothing was added) ---
   uint32_t addMenuItem(const WString& label, const String& msg, bool active = true);
@@ -89,7 +90,9 @@ class MenuGlob : public Glob {
   uint32_t addIconicMenuItem(const WString& image, const WString& pressedImage, const String& msg);
   uint32_t startMenuGroup(const WString& label, MenuGroupState state = GroupDefault);
   uint32_t startMenuGroup(unsigned int resourceId, MenuGroupState state = GroupDefault);
-  void endMenuGroup() { inGroup = false; }
+  void endMenuGroup() {
+    if (menuState_) menuState_->inGroup = false;
+  }
   uint32_t insertMenuItemAfter(const WString& label, const String& msg, const WString& after);
   bool removeMenuItem(const WString& label);
   bool removeMenuItem(unsigned int resourceId);
@@ -103,7 +106,7 @@ class MenuGlob : public Glob {
   void clearMenu();
   int findMenuItem(const WString& label) const;
   int findMenuItem(uint32_t id) const;
-  const std::vector<MenuItem>& menuItems() const { return items; }
+  const std::vector<MenuItem>& menuItems() const { return menuState().items; }
 
   // The two labels toggleMenuEntry shows for a resource text, for the flag off and on.
   static WString toggleLabel(unsigned int resourceId, bool on);
@@ -123,23 +126,32 @@ class MenuGlob : public Glob {
 
  protected:
   // True when the items changed since the open pop-up was given them.
-  virtual bool menuNeedsUpdate() const { return itemsChanged_; }
+  virtual bool menuNeedsUpdate() const { return menuState().itemsChanged; }
 
-  std::vector<MenuItem> items;
-  GlobHandle<Menu> menu;
-  bool hasMenuBaseCol = false;
-  Colour menuBaseCol;
-  WString menuTitle;
-  String menuPrefsKey;
-  unsigned menuOptions = kDefaultMenuOptions;
-  bool inGroup = false;
-  MenuGroupState defaultGroupState = GroupExpanded;
+  // Everything about the menu a Glob may own. Most Globs never build one, so it is made on
+  // first use and costs them a pointer.
+  struct MenuState {
+    std::vector<MenuItem> items;
+    GlobHandle<Menu> menu;
+    bool hasMenuBaseCol = false;
+    Colour menuBaseCol;
+    WString menuTitle;
+    String menuPrefsKey;
+    unsigned menuOptions = kDefaultMenuOptions;
+    bool inGroup = false;
+    MenuGroupState defaultGroupState = GroupExpanded;
+    bool itemsChanged = false;
+  };
+  MenuState& menuState();
+  // The state, or the defaults of one never made.
+  const MenuState& menuState() const;
 
  private:
   bool handleRightPress(Event* e);
   void handleMenuClosed();
   MenuItem newItem(const WString& label, const String& msg, MenuItemType type) const;
   void itemsChanged();
+  bool hasMenuItems() const { return menuState_ && !menuState_->items.empty(); }
 
-  bool itemsChanged_ = false;
+  std::unique_ptr<MenuState> menuState_;
 };
