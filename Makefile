@@ -54,7 +54,7 @@ demo: bootstrap $(BUILD)/build.ninja
 	@tools/run-gallery $(BUILD)/globkit-gallery
 
 format:
-	find platform foundation buttons panels text values lists tests bench gallery -name '*.h' -o -name '*.cpp' | xargs clang-format -i
+	find platform foundation buttons menus panels text values lists tests bench gallery -name '*.h' -o -name '*.cpp' | xargs clang-format -i
 
 clean:
 	rm -rf $(BUILD) $(ASAN_BUILD) $(BENCH_BUILD)

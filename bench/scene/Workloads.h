@@ -11,6 +11,8 @@ void runFrames();
 void runInput();
 // W5: bytes per control of S(10000), peak and resident set and heap.
 void runMemory();
+// W6: a pop-up menu of 100,000 items built, shown and scrolled by pages.
+void runMenu();
 // The size of every control class.
 void reportSizes(bool asNotes);
 

@@ -19,7 +19,7 @@ int main(int argc, char** argv) {
   } else if (mode == "w5") {
     scene::runMemory();
   } else if (mode == "w6") {
-    scene::note("W6: the pop-up menu has not landed; no figure yet");
+    scene::runMenu();
   } else if (mode == "sizes") {
     scene::reportSizes(false);
   } else {
