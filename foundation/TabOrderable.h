@@ -48,7 +48,20 @@ class TabOrderable {
   // that controls built by the thousand cost no allocation for it.
   std::shared_ptr<bool> aliveFlag();
 
-  mutable std::vector<TabOrderManager*> managers_;
+  // What only some stops need: registrations after the first, and the liveness flag.
+  struct More {
+    std::vector<TabOrderManager*> managers;
+    std::shared_ptr<bool> alive;
+  };
+  More& more() const;
+  // Every registration in order (the first, then the rest); call under the lock.
+  std::vector<TabOrderManager*> registrations() const;
+  // Drops the first registration of `m`, or every one; call under the write lock.
+  void dropRegistrations(const TabOrderManager* m, bool all) const;
+
+  // Most controls sit in one panel's tab order: its manager is kept here without a container.
+  // Invariant: when first_ is null there are no further registrations.
+  mutable TabOrderManager* first_ = nullptr;
+  mutable std::unique_ptr<More> more_;
   Kw::RWLock lock_{1, 100, 1};
-  std::shared_ptr<bool> alive_;
 };

@@ -142,7 +142,8 @@ void PanelStandardWidgets::syncTitleBox() {
     if (box) delete box;
     title_.reset();
   } else if (!box) {
-    const auto width = static_cast<unsigned short>(std::clamp(maxTitleWidth(), 0, 0xFFFF));
+    const auto width =
+        static_cast<unsigned short>(std::clamp(maxTitleWidth(panel_, this), 0, 0xFFFF));
     title_ = new PanelTitleTextBox(panel_, width, kTitleBoxHeight, editable);
   } else if (box->isEditable() != editable) {
     box->setEditable(editable);
@@ -153,19 +154,23 @@ void PanelStandardWidgets::showTitle(const WString& title) {
   if (PanelTitleTextBox* box = title_.get()) box->showTitle(title);
 }
 
-int PanelStandardWidgets::titleButtonsLeft() const {
-  const PanelFrame f = panel_.frame();
+int PanelStandardWidgets::titleButtonsLeft(const StandardPanel& panel,
+                                           const PanelStandardWidgets* widgets) {
+  const PanelFrame f = panel.frame();
   int left = f.size.x - PanelGeometry::borderSize(f.border) - kTitleMargin;
-  const Glob* buttons[] = {poot_.get(), size_.get(), pin_.get(), settings_.get()};
+  if (!widgets) return left;
+  const Glob* buttons[] = {widgets->poot_.get(), widgets->size_.get(), widgets->pin_.get(),
+                           widgets->settings_.get()};
   for (const Glob* g : buttons) {
-    if (g && onPanel(g)) left = std::min(left, g->canvas()->rect().x0 - kTitleGap);
+    if (g && widgets->onPanel(g)) left = std::min(left, g->canvas()->rect().x0 - kTitleGap);
   }
   return left;
 }
 
-int PanelStandardWidgets::maxTitleWidth() const {
-  const int left = PanelGeometry::borderSize(panel_.getBorderStyle()) + kTitleMargin;
-  return std::max(0, titleButtonsLeft() - left);
+int PanelStandardWidgets::maxTitleWidth(const StandardPanel& panel,
+                                        const PanelStandardWidgets* widgets) {
+  const int left = PanelGeometry::borderSize(panel.getBorderStyle()) + kTitleMargin;
+  return std::max(0, titleButtonsLeft(panel, widgets) - left);
 }
 
 void PanelStandardWidgets::position() {
@@ -201,7 +206,7 @@ void PanelStandardWidgets::position() {
     moveTo(settings, leftOf(anchor) - settings->width(), centreY(settings));
   }
   if (Glob* box = titleBoxGlob()) {
-    const int w = maxTitleWidth();
+    const int w = maxTitleWidth(panel_, this);
     const int x = PanelGeometry::borderSize(frame.border) + kTitleMargin;
     const Kw::Box<int>& r = box->canvas()->rect();
     if (r.x0 != x || r.y0 != centreY(box) || r.width() != w) {

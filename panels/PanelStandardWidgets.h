@@ -35,10 +35,11 @@ class PanelStandardWidgets {
   // Places every widget in the panel's strips as the panel is now.
   void position();
 
-  // The left edge of the title buttons (less the gap), or the right end of the strip.
-  int titleButtonsLeft() const;
+  // The left edge of `panel`'s title buttons (less the gap), or the right end of the strip;
+  // `widgets` is the panel's record, null when it has none.
+  static int titleButtonsLeft(const StandardPanel& panel, const PanelStandardWidgets* widgets);
   // The width left for the title box between the left border and the title buttons.
-  int maxTitleWidth() const;
+  static int maxTitleWidth(const StandardPanel& panel, const PanelStandardWidgets* widgets);
 
   Glob* widget(StandardWidgetFlag flag) const;
   PanelTitleTextBox* titleBox() const;

@@ -90,8 +90,16 @@ StandardPanel::StandardPanel(const GlobCreationInfo& info) : rect(info) {
   init();
 }
 
+// What a panel keeps while it is modal, to restore when it stops being so.
+struct StandardPanel::ModalState {
+  bool savedDismissable = false;
+  bool savedPinActive = true;
+  GlobHandle<> pin;
+  GlobHandle<ModalShade> shade;
+  GlobHandle<> screen;  // the screen whose input the panel holds
+};
+
 void StandardPanel::init() {
-  std_ = std::make_unique<PanelStandardWidgets>(*this);
   fullHeight_ = height();
   canvas()->setOpaque(getcol().a >= 1.0);
 }
@@ -136,7 +144,7 @@ void StandardPanel::setBorderStyle(UifTypeOfBorder border) {
 void StandardPanel::setTitle(const WString& title) {
   if (title == title_) return;
   title_ = title;
-  std_->showTitle(title_);
+  if (std_) std_->showTitle(title_);
   update();
 }
 
@@ -181,7 +189,7 @@ void StandardPanel::applySizeState(size_state state) {
     hiddenByMinimise_.clear();
     std::vector<Glob*> hide;
     getChildren(hide);
-    if (Glob* doIt = std_->doIt()) hide.push_back(doIt);
+    if (Glob* doIt = std_ ? std_->doIt() : nullptr) hide.push_back(doIt);
     for (Glob* g : hide) {
       if (!g->isVisible()) continue;
       g->unmap_canvas();
@@ -189,8 +197,9 @@ void StandardPanel::applySizeState(size_state state) {
     }
     sizeState_ = state;
     const int h =
-        2 * calcBorderSize(border_) +
-        (PanelGeometry::hasTitleStrip(std_->flags()) ? PanelGeometry::kTitleStripHeight : 0);
+        2 * calcBorderSize(border_) + (PanelGeometry::hasTitleStrip(getStandardWidgetFlags())
+                                           ? PanelGeometry::kTitleStripHeight
+                                           : 0);
     reshape_canvas(r.x0, r.y1 - h, r.width(), h);
   } else {
     sizeState_ = state;
@@ -200,7 +209,7 @@ void StandardPanel::applySizeState(size_state state) {
     }
     hiddenByMinimise_.clear();
   }
-  std_->syncSizeButton();
+  if (std_) std_->syncSizeButton();
   update();
 }
 
@@ -208,7 +217,7 @@ void StandardPanel::applySizeState(size_state state) {
 
 PanelFrame StandardPanel::frame() const {
   PanelFrame f;
-  f.flags = std_->flags();
+  f.flags = getStandardWidgetFlags();
   f.size = XY<int>(width(), height());
   f.border = border_;
   f.extraLeft = innerInsets_.x;
@@ -288,32 +297,35 @@ void StandardPanel::joinTabOrder(Glob* widget, Glob* insertAfter) {
   if (!stop) {
     // A composite control takes part through the stops it hands out, in its own order.
     if (auto* host = dynamic_cast<TabOrderableHost*>(widget))
-      tabOrder_.addTabStops(*host, TabOrderManager::kAfterLast);
+      tabOrder().addTabStops(*host, TabOrderManager::kAfterLast);
     return;
   }
+  TabOrderManager& tabs = tabOrder();
   unsigned order = TabOrderManager::kAfterLast;
   if (auto* after =
           is_good_glob_ptr(insertAfter) ? dynamic_cast<TabOrderable*>(insertAfter) : nullptr) {
-    for (unsigned i = 0; i < tabOrder_.numTabStops(); ++i) {
-      if (tabOrder_.getTabStopObject(i) != after) continue;
-      const unsigned afterOrder = tabOrder_.getTabStopTabOrder(i);
+    for (unsigned i = 0; i < tabs.numTabStops(); ++i) {
+      if (tabs.getTabStopObject(i) != after) continue;
+      const unsigned afterOrder = tabs.getTabStopTabOrder(i);
       if (afterOrder + 1 < TabOrderManager::kFirstReservedOrder) order = afterOrder + 1;
       break;
     }
   }
-  if (!tabOrder_.addTabStop(*stop, order)) tabOrder_.addTabStop(*stop, TabOrderManager::kAfterLast);
+  if (!tabs.addTabStop(*stop, order)) tabs.addTabStop(*stop, TabOrderManager::kAfterLast);
 }
 
 bool StandardPanel::removeWidget(Glob* widget, bool destroy) {
   Glob* live = nullptr;
   if (!widgets_.remove(widget, live)) return false;
-  if (live) {
-    if (auto* stop = dynamic_cast<TabOrderable*>(live)) tabOrder_.removeTabStop(*stop);
+  if (live && tabOrder_) {
+    if (auto* stop = dynamic_cast<TabOrderable*>(live)) tabOrder_->removeTabStop(*stop);
     if (auto* host = dynamic_cast<TabOrderableHost*>(live)) {
       std::vector<TabOrderable*> stops;
       host->getTabOrderables(stops);
-      for (TabOrderable* s : stops) tabOrder_.removeTabStop(s);
+      for (TabOrderable* s : stops) tabOrder_->removeTabStop(s);
     }
+  }
+  if (live) {
     if (destroy) delete live;
   }
   update();
@@ -375,52 +387,58 @@ void StandardPanel::recalculateWidgetPositions() {
 
 // --- Tab order ---
 
+TabOrderManager& StandardPanel::tabOrder() {
+  if (!tabOrder_) tabOrder_ = std::make_unique<TabOrderManager>();
+  return *tabOrder_;
+}
+
 bool StandardPanel::incrementTab() {
-  if (tabOrder_.numTabStops() == 0) return false;
-  return tabOrder_.incrementTabStop() != TabOrderManager::kNone;
+  if (!tabOrder_ || tabOrder_->numTabStops() == 0) return false;
+  return tabOrder_->incrementTabStop() != TabOrderManager::kNone;
 }
 
 bool StandardPanel::decrementTab() {
-  if (tabOrder_.numTabStops() == 0) return false;
-  return tabOrder_.decrementTabStop() != TabOrderManager::kNone;
+  if (!tabOrder_ || tabOrder_->numTabStops() == 0) return false;
+  return tabOrder_->decrementTabStop() != TabOrderManager::kNone;
 }
 
 // --- Standard widgets ---
 
 PanelTitleTextBox* StandardPanel::titleBox() const {
-  return std_->titleBox();
+  return std_ ? std_->titleBox() : nullptr;
 }
 
 Glob* StandardPanel::standardWidget(StandardWidgetFlag flag) const {
-  return std_->widget(flag);
+  return std_ ? std_->widget(flag) : nullptr;
 }
 
 int StandardPanel::getStandardWidgetFlags() const {
-  return std_->flags();
+  return std_ ? std_->flags() : 0;
 }
 
 void StandardPanel::addStandardWidgets(int flags) {
+  if (!std_) std_ = std::make_unique<PanelStandardWidgets>(*this);
   std_->add(flags);
   recalculateWidgetPositions();
   update();
 }
 
 void StandardPanel::removeStandardWidgets(int flags, bool redraw) {
-  if (!std_->remove(flags)) return;
+  if (!std_ || !std_->remove(flags)) return;
   recalculateWidgetPositions();
   if (redraw) update();
 }
 
 int StandardPanel::titleButtonsLeft() const {
-  return std_->titleButtonsLeft();
+  return PanelStandardWidgets::titleButtonsLeft(*this, std_.get());
 }
 
 int StandardPanel::calcMaxTitleWidgetWidth() const {
-  return std_->maxTitleWidth();
+  return PanelStandardWidgets::maxTitleWidth(*this, std_.get());
 }
 
 void StandardPanel::positionStandardWidgets() {
-  std_->position();
+  if (std_) std_->position();
 }
 
 // --- Pinning and modal display ---
@@ -428,11 +446,11 @@ void StandardPanel::positionStandardWidgets() {
 void StandardPanel::setDismissable(bool dismissable) {
   if (dismissable == dismissable_) return;
   dismissable_ = dismissable;
-  std_->syncPinButton();
+  if (std_) std_->syncPinButton();
 }
 
 Glob* StandardPanel::modalShade() const {
-  return shade_.get();
+  return modal_ ? modal_->shade.get() : nullptr;
 }
 
 int StandardPanel::setModal(bool modal) {
@@ -447,17 +465,19 @@ int StandardPanel::setModal(bool modal) {
 
 void StandardPanel::enterModal() {
   refresh_off();
-  savedDismissable_ = dismissable_;
-  Glob* pin = std_->pin();
-  modalPin_ = pin;
+  if (!modal_) modal_ = std::make_unique<ModalState>();
+  ModalState& m = *modal_;
+  m.savedDismissable = dismissable_;
+  Glob* pin = std_ ? std_->pin() : nullptr;
+  m.pin = pin;
   if (pin) {
-    savedPinActive_ = pin->isActive();
+    m.savedPinActive = pin->isActive();
     pin->setActive(false, true);
   }
   setDismissable(false);
   if (RootGlob* screen = root(); screen && static_cast<Glob*>(screen) != this) {
-    shade_ = new ModalShade(*screen, Glib::PanelLook(getPalette()).modalShadeColour());
-    screen->followScreenSize(shade_.get());
+    m.shade = new ModalShade(*screen, Glib::PanelLook(getPalette()).modalShadeColour());
+    screen->followScreenSize(m.shade.get());
     // The shade is now on top of the screen; lift this panel's top-level ancestor above it.
     Glob* top = this;
     while (top->parent() && top->parent() != screen) top = top->parent();
@@ -465,20 +485,22 @@ void StandardPanel::enterModal() {
     // The shade stops the pointer; the scope stops keys, Tab included, reaching what lies
     // beneath it.
     screen->addInputScope(this);
-    modalScreen_ = screen;
+    m.screen = screen;
   }
   refresh_on();
 }
 
 void StandardPanel::leaveModal() {
+  if (!modal_) return;
   refresh_off();
-  if (ModalShade* shade = shade_.get()) delete shade;
-  shade_.reset();
-  if (auto* screen = dynamic_cast<RootGlob*>(modalScreen_.get())) screen->removeInputScope(this);
-  modalScreen_.reset();
-  setDismissable(savedDismissable_);
-  if (Glob* pin = modalPin_.get()) pin->setActive(savedPinActive_, true);
-  modalPin_.reset();
+  ModalState& m = *modal_;
+  if (ModalShade* shade = m.shade.get()) delete shade;
+  m.shade.reset();
+  if (auto* screen = dynamic_cast<RootGlob*>(m.screen.get())) screen->removeInputScope(this);
+  m.screen.reset();
+  setDismissable(m.savedDismissable);
+  if (Glob* pin = m.pin.get()) pin->setActive(m.savedPinActive, true);
+  m.pin.reset();
   refresh_on();
 }
 
@@ -517,7 +539,7 @@ int StandardPanel::reactToMessage(Event* e) {
     handleFlipSize();
     return 1;
   }
-  if (std_->pin() && (msg == "pin on" || msg == "pin off")) {
+  if (std_ && std_->pin() && (msg == "pin on" || msg == "pin off")) {
     setDismissable(msg == "pin off");
     return 1;
   }

@@ -167,7 +167,8 @@ class StandardPanel : public rect {
   void recalculateWidgetPositions();
 
   // --- Tab order ---
-  TabOrderManager& tabOrder() { return tabOrder_; }
+  // The panel's tab order, made when first asked for or when a focusable widget is added.
+  TabOrderManager& tabOrder();
   // Move to the next / previous stop, wrapping round; false when there is no stop to go to.
   bool incrementTab();
   bool decrementTab();
@@ -226,8 +227,12 @@ class StandardPanel : public rect {
   XY<int> minSize_;
   XY<int> innerInsets_;
   WString title_;
-  TabOrderManager tabOrder_;
+  // Made on first use: most panels (every check box and text box is one) never have a child
+  // that takes focus, never get a title button and are never modal.
+  std::unique_ptr<TabOrderManager> tabOrder_;
   std::unique_ptr<PanelStandardWidgets> std_;
+  struct ModalState;
+  std::unique_ptr<ModalState> modal_;
 
   // Size.
   size_state sizeState_ = SizeFull;
@@ -237,9 +242,4 @@ class StandardPanel : public rect {
   // Pinning and modal display.
   bool dismissable_ = false;
   int modalDepth_ = 0;
-  bool savedDismissable_ = false;
-  bool savedPinActive_ = true;
-  GlobHandle<> modalPin_;
-  GlobHandle<ModalShade> shade_;
-  GlobHandle<> modalScreen_;  // the screen whose input the panel holds while modal
 };

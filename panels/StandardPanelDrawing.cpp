@@ -18,7 +18,7 @@ void StandardPanel::drawBackground() {
   const PanelFrame f = frame();
   const Kw::Box<int> title = PanelGeometry::titleStrip(f);
   // A title box shows the title itself; otherwise the strip carries it.
-  const bool stripTitle = !title.empty() && !std_->titleBoxGlob() && !title_.empty();
+  const bool stripTitle = !title.empty() && !(std_ && std_->titleBoxGlob()) && !title_.empty();
   const Kw::Box<int> titleText =
       stripTitle ? Kw::Box<int>(title.x0 + kTitleMargin, title.y0 + 1, titleButtonsLeft(), title.y1)
                  : Kw::Box<int>();

@@ -1,7 +1,11 @@
 #pragma once
-// Reader-writer lock of the core module. The constructor's tuning parameters are accepted for
-// compatibility with callers that pass them and have no effect on this implementation.
-#include <shared_mutex>
+// Reader-writer lock of the core module, one 32-bit word: every focusable control carries
+// one, so it must cost no more than a counter. Contention is rare (the GUI thread does nearly
+// all the work), so a waiter spins briefly and then yields its time slice. Read locks may be
+// taken again by a thread that holds one; a write lock is not recursive. The constructor's
+// tuning parameters are accepted for callers that pass them and have no effect.
+#include <atomic>
+#include <cstdint>
 
 namespace Kw {
 
@@ -12,10 +16,10 @@ class RWLock {
   RWLock(const RWLock&) = delete;
   RWLock& operator=(const RWLock&) = delete;
 
-  void lockRead() const { mutex_.lock_shared(); }
-  void unlockRead() const { mutex_.unlock_shared(); }
-  void lockWrite() const { mutex_.lock(); }
-  void unlockWrite() const { mutex_.unlock(); }
+  void lockRead() const;
+  void unlockRead() const { state_.fetch_sub(1, std::memory_order_release); }
+  void lockWrite() const;
+  void unlockWrite() const { state_.store(0, std::memory_order_release); }
 
   class ReadGuard {
    public:
@@ -39,7 +43,9 @@ class RWLock {
   };
 
  private:
-  mutable std::shared_mutex mutex_;
+  static constexpr int32_t kWriter = -1;
+  // The number of readers, or kWriter while a writer holds the lock.
+  mutable std::atomic<int32_t> state_{0};
 };
 
 }  // namespace Kw

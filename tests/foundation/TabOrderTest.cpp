@@ -283,3 +283,25 @@ TEST_F(TabOrderTest, HandlersMayCallBackIntoTheManager) {
   EXPECT_EQ(owned.get()->incrementTabStop(), kNone);  // gone by the time it would answer
   EXPECT_EQ(owned, nullptr);
 }
+
+// The first registration is kept apart from the rest; whichever goes, the others keep their
+// order and a duplicate registration leaves one entry at a time.
+TEST_F(TabOrderTest, ManagersStayInRegistrationOrderWhicheverLeaves) {
+  TabOrderManager first(false), dup(true), last(false);
+  Focusable* a = make();
+  first.addTabStop(a, 0);
+  dup.addTabStop(a, 0);
+  dup.addTabStop(a, 1);
+  last.addTabStop(a, 0);
+  EXPECT_EQ(a->getManagers(), (std::vector<TabOrderManager*>{&first, &dup, &last}));
+
+  EXPECT_TRUE(first.removeTabStop(*a));
+  EXPECT_EQ(a->getManagers(), (std::vector<TabOrderManager*>{&dup, &last}));
+  EXPECT_TRUE(dup.removeTabStop(0u));
+  EXPECT_TRUE(a->isRegisteredWith(&dup));
+  EXPECT_TRUE(dup.removeTabStop(0u));
+  EXPECT_FALSE(a->isRegisteredWith(&dup));
+  EXPECT_EQ(a->getManagers(), (std::vector<TabOrderManager*>{&last}));
+  EXPECT_TRUE(a->requestTabStopFocus());
+  EXPECT_TRUE(last.isTabStopFocus(*a));
+}
