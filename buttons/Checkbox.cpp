@@ -81,12 +81,14 @@ void Checkbox::applyArgs(const CheckboxInitArgs& args) {
   if (s.msgGeneration != GenerateOnRelease) s.msgGeneration = GenerateOnPress;
   if (s.appearance < BoxLeft || s.appearance > FlatToggle) s.appearance = BoxLeft;
   if (!(s == *settings_)) settings_.edit() = s;
+  label_ = args.label;
   StandardPanel::setBorderStyle(s.borderStyle);
   clicksEnabled = args.clicksEnabled;
 }
 
 void Checkbox::copySettingsFrom(const Checkbox& other) {
   settings_ = other.settings_;
+  label_ = other.label_;
   StandardPanel::setBorderStyle(settings_->borderStyle);
   clicksEnabled = other.clicksEnabled;
   textColourWhenTicked = other.textColourWhenTicked;
@@ -241,14 +243,14 @@ void Checkbox::setBorderStyle(UifTypeOfBorder border) {
 }
 
 String Checkbox::describeValue() const {
-  return Kw::toUtf8(settings_->label) + (ticked ? " [ticked]" : " [clear]");
+  return Kw::toUtf8(label_) + (ticked ? " [ticked]" : " [clear]");
 }
 
 // --- Look ---
 
 void Checkbox::setLabel(const WString& text) {
-  if (text == settings_->label) return;
-  settings_.edit().label = text;
+  if (text == label_) return;
+  label_ = text;
   update();
 }
 
@@ -392,18 +394,17 @@ void Checkbox::drawLabel() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   const Kw::Box<int> box = labelBox();
-  if (!settings_->label.empty() && !box.empty()) {
-    p.text(settings_->label, box, *Glib::fonts().get(labelFont()), getTextColour(),
-           settings_->textAlignment, Glib::TextStyles::Plain);
+  if (!label_.empty() && !box.empty()) {
+    p.text(label_, box, *Glib::fonts().get(labelFont()), getTextColour(), settings_->textAlignment,
+           Glib::TextStyles::Plain);
   }
   if (hasKeyboardFocus()) {
     const Kw::Box<int> ind = indicatorBox();
     // Round the indicator and the label's text, not the whole label box.
     Kw::Box<int> text = box;
-    if (!settings_->label.empty() && settings_->textAlignment == TextAlignment::Left)
-      text.x1 = std::min(box.x1,
-                         box.x0 + Glib::fonts().get(labelFont())->textWidth(settings_->label) + 2);
-    const Kw::Box<int> mark = settings_->label.empty()
+    if (!label_.empty() && settings_->textAlignment == TextAlignment::Left)
+      text.x1 = std::min(box.x1, box.x0 + Glib::fonts().get(labelFont())->textWidth(label_) + 2);
+    const Kw::Box<int> mark = label_.empty()
                                   ? inset(ind, -2, -2)
                                   : Kw::Box<int>(std::min(ind.x0, text.x0) - 2, ind.y0 - 2,
                                                  std::max(ind.x1, text.x1) + 1, ind.y1 + 2);

@@ -63,7 +63,6 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
   // once: boxes left at the defaults share one record, CheckboxInitArgs carries one and copies
   // take it whole. The colours are not here: their defaults come from the palette.
   struct Settings {
-    WString label;
     Glib::FontDesc font;
     String msgPrefix = kDefaultPrefix;
     bool appendState = true;
@@ -145,7 +144,7 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
 
   // --- Look ---
   void setLabel(const WString& text);
-  const WString& getLabel() const { return settings_->label; }
+  const WString& getLabel() const { return label_; }
   void setFont(const Glib::FontDesc& desc);
   const Glib::FontDesc& getFont() const { return settings_->font; }
   void setTextColourWhenTicked(const Colour& c);
@@ -187,6 +186,8 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
   static int indicatorWidth(Appearance a);
 
   bool ticked = false;
+  // Every box has its own label, so it lives here and not in the shared settings.
+  WString label_;
   Kw::SharedRecord<Settings> settings_;
   bool clicksEnabled = true;  // changes with the box's part in a radio row, so kept apart
   UserFunction userFunction = nullptr;
@@ -200,12 +201,11 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
 // settings.
 struct CheckboxInitArgs : GlobCreationInfo {
   bool ticked = false;
+  WString label;
   Checkbox::Settings settings;
   bool clicksEnabled = true;
 
   CheckboxInitArgs() = default;
   CheckboxInitArgs(const WString& label, bool tick, const GlobCreationInfo& where)
-      : GlobCreationInfo(where), ticked(tick) {
-    settings.label = label;
-  }
+      : GlobCreationInfo(where), ticked(tick), label(label) {}
 };

@@ -2,19 +2,25 @@
 
 #include <utility>
 
+EditHistory::Lists& EditHistory::lists() {
+  if (!lists_) lists_ = std::make_unique<Lists>();
+  return *lists_;
+}
+
 void EditHistory::record(Item item) {
-  undo_.push_back(std::move(item));
-  redo_.clear();
+  Lists& l = lists();
+  l.undo.push_back(std::move(item));
+  l.redo.clear();
   trim();
 }
 
 void EditHistory::clear() {
-  undo_.clear();
-  redo_.clear();
+  lists_.reset();
 }
 
 void EditHistory::trim() {
-  while (undo_.size() > kDepth) undo_.pop_front();
+  std::deque<Item>& undo = lists_->undo;
+  while (undo.size() > kDepth) undo.pop_front();
 }
 
 bool EditHistory::joinsWord(wchar_t older, wchar_t newer) {
@@ -23,14 +29,15 @@ bool EditHistory::joinsWord(wchar_t older, wchar_t newer) {
 }
 
 bool EditHistory::undo(const GroupAction& revert) {
-  if (undo_.empty()) return false;
+  if (!canUndo()) return false;
+  std::deque<Item>& undo = lists_->undo;
   std::size_t count = 1;
-  const Item& newest = undo_.back();
+  const Item& newest = undo.back();
   if (newest.isTyping()) {
     // Merge backwards while the older items are typing of the same kind.
-    while (count < undo_.size()) {
-      const Item& older = undo_[undo_.size() - 1 - count];
-      const Item& newer = undo_[undo_.size() - count];
+    while (count < undo.size()) {
+      const Item& older = undo[undo.size() - 1 - count];
+      const Item& newer = undo[undo.size() - count];
       if (!older.isTyping() || !joinsWord(older.inserted[0], newer.inserted[0])) break;
       ++count;
     }
@@ -38,20 +45,22 @@ bool EditHistory::undo(const GroupAction& revert) {
   Group group;
   group.reserve(count);
   for (std::size_t i = 0; i < count; ++i) {
-    group.push_back(std::move(undo_.back()));
-    undo_.pop_back();
+    group.push_back(std::move(undo.back()));
+    undo.pop_back();
   }
   revert(group);
-  redo_.push_back(std::move(group));
+  // The action may have cleared the history.
+  lists().redo.push_back(std::move(group));
   return true;
 }
 
 bool EditHistory::redo(const GroupAction& replay) {
-  if (redo_.empty()) return false;
-  Group group = std::move(redo_.back());
-  redo_.pop_back();
+  if (!canRedo()) return false;
+  Group group = std::move(lists_->redo.back());
+  lists_->redo.pop_back();
   replay(group);
-  for (auto it = group.rbegin(); it != group.rend(); ++it) undo_.push_back(std::move(*it));
+  std::deque<Item>& undo = lists().undo;
+  for (auto it = group.rbegin(); it != group.rend(); ++it) undo.push_back(std::move(*it));
   trim();
   return true;
 }

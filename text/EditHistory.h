@@ -13,6 +13,7 @@
 #include <cstddef>
 #include <deque>
 #include <functional>
+#include <memory>
 #include <span>
 #include <vector>
 
@@ -43,9 +44,9 @@ class EditHistory {
   void record(Item item);
   void clear();
 
-  bool canUndo() const { return !undo_.empty(); }
-  bool canRedo() const { return !redo_.empty(); }
-  std::size_t undoCount() const { return undo_.size(); }
+  bool canUndo() const { return lists_ && !lists_->undo.empty(); }
+  bool canRedo() const { return lists_ && !lists_->redo.empty(); }
+  std::size_t undoCount() const { return lists_ ? lists_->undo.size() : 0; }
 
   // Hands the newest group of undo items (newest first) to `revert` and moves it to the redo
   // list. A group is the newest item alone, unless it is typing: then older typing joins it
@@ -61,8 +62,13 @@ class EditHistory {
   static bool joinsWord(wchar_t older, wchar_t newer);
 
  private:
+  struct Lists {
+    std::deque<Item> undo;
+    std::vector<Group> redo;
+  };
+  Lists& lists();
   void trim();
 
-  std::deque<Item> undo_;
-  std::vector<Group> redo_;
+  // Made at the first edit: a box that is only shown, never edited, keeps no lists.
+  std::unique_ptr<Lists> lists_;
 };

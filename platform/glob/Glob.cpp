@@ -59,8 +59,7 @@ void Glob::setContextString(const String& text) {
 }
 
 void Glob::setDefaultCursor(MouseCursorID id) {
-  if (id == kCursorArrow && !extras_) return;
-  extras().cursor = id;
+  cursor_ = static_cast<uint8_t>(id);
 }
 
 void Glob::deleteChildren() {

@@ -98,7 +98,7 @@ class Glob : public CanvasClient, public Drawable {
   void setContextString(const String& text);
   // The cursor the base contextCursor returns.
   void setDefaultCursor(MouseCursorID id);
-  MouseCursorID defaultCursor() const { return extras_ ? extras_->cursor : kCursorArrow; }
+  MouseCursorID defaultCursor() const { return static_cast<MouseCursorID>(cursor_); }
 
   // Queues `msg` for `target`; it is delivered by the loop, in order, if the target still
   // exists then.
@@ -126,7 +126,6 @@ class Glob : public CanvasClient, public Drawable {
   struct Extras {
     String name;
     String contextText;
-    MouseCursorID cursor = kCursorArrow;
   };
   Extras& extras();
 
@@ -139,6 +138,7 @@ class Glob : public CanvasClient, public Drawable {
   int interest_ = 0;
   bool active_ = true;
   bool canBeIt_ = true;
+  uint8_t cursor_ = kCursorArrow;  // a MouseCursorID; every one fits a byte
 };
 
 // --- Liveness ---
