@@ -82,6 +82,17 @@ class DropDownButton : public Button {
     update();
   }
   bool getDrawSeparator() const { return ddSettings_->drawSeparator; }
+  void setBoldLabel(bool on) {
+    if (on == ddSettings_->boldLabel) return;
+    ddSettings_.edit().boldLabel = on;
+    update();
+  }
+  // The font of the label: the standard font, bold when asked.
+  Glib::FontPtr labelFont() const {
+    Glib::FontDesc f;
+    if (ddSettings_->boldLabel) f.style = Glib::FontDesc::Bold;
+    return Glib::fonts().get(f);
+  }
   const DropDownSettings& dropDownSettings() const { return *ddSettings_; }
 
   void switch_state(button_state newState, bool silent) override {
@@ -138,8 +149,7 @@ class DropDownButton : public Button {
         Kw::Box<int>(room.x0 + side, room.y0 + 1, room.x1 - 2, room.y1 - 1),
         get_state() == kButtonDown, get_style() == kButtonStyleFlat);
     if (box.empty()) return;
-    p.text(shownLabel(), box, *Glib::fonts().standard(), labelColour(), getTextAlignment(),
-           getTextStyle());
+    p.text(shownLabel(), box, *labelFont(), labelColour(), getTextAlignment(), getTextStyle());
   }
 
   DropDownSettings& editDropDownSettings() { return ddSettings_.edit(); }

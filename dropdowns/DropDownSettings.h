@@ -8,6 +8,7 @@ struct DropDownSettings {
   bool drawSeparator = false;  // an etched line between the label and the arrow
   bool wheelEnabled = true;    // the wheel steps the selection
   bool showSelection = true;   // the open list marks the selected entry
+  bool boldLabel = false;      // the label in the bold standard font
   String prefsKey;             // where the list's group states are kept; empty: not kept
   int maxVisibleRows = -1;     // rows the open list shows before it scrolls; negative: no limit
   bool addEntry = false;       // the list has an add row (MenuWithAddButton)
