@@ -138,6 +138,8 @@ class DropDownButton : public Button {
   // A new list over the button's entries, owned by nobody yet; null when there is nothing to
   // show.
   virtual T* makeMenu() = 0;
+  // Called once the new list is on the screen.
+  virtual void listShown(T* list) {}
   // A message from the open list; true means the list is done and goes.
   virtual bool handleDropDownMessage(const String& msg) { return true; }
   // The kind name a live list answers to.
@@ -163,6 +165,7 @@ class DropDownButton : public Button {
       const Kw::Box<int> r = canvas()->rootRect();
       if (list->popUp(*screen, XY<int>(r.x0, r.y0))) {
         list_ = GlobHandle<T>(list);
+        listShown(list);
         return true;
       }
       delete list;

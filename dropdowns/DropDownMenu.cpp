@@ -8,22 +8,6 @@
 namespace {
 
 MenuData listData(std::vector<MenuItem> items, Glob* owner) {
-  // Entries left at the items' default colours take the owner's palette, so that a list opened
-  // in the light palette is light.
-  if (owner) {
-    const Palette standard;
-    const Glib::MenuLook look(owner->getPalette());
-    const Colour face = MenuItem::getDefaultColour();
-    const Colour text = standard.get(Palette::WindowText);
-    const Colour ownFace = look.itemFace();
-    const Colour ownText = look.itemText();
-    if (!(face == ownFace && text == ownText)) {
-      for (MenuItem& it : items) {
-        if (it.col() == face) it.col(ownFace);
-        if (it.fCol() == text) it.fCol(ownText);
-      }
-    }
-  }
   MenuData d;
   d.items = std::move(items);
   d.owner = owner;

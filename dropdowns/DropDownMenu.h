@@ -6,7 +6,7 @@
 //
 // Decisions where the behaviour was left open:
 // - No title strip; a press outside closes it, as any pop-up.
-// - When it opens on a long list, the selected entry is scrolled into view.
+// - Its drop-down scrolls the selected entry into view when it opens on a long list.
 #include "menus/DropDownMenuData.h"
 #include "menus/Menu.h"
 #include "platform/misc/ValClient.h"

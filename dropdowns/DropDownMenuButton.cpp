@@ -7,6 +7,7 @@
 #include "menus/MenuItemList.h"
 #include "platform/glib/FontCache.h"
 #include "platform/glib/iFont.h"
+#include "platform/glib/look/MenuLook.h"
 #include "platform/glob/KeyCodes.h"
 #include "platform/misc/Diagnostics.h"
 
@@ -39,6 +40,8 @@ DropDownMenuButton::DropDownMenuButton(const WString& title, const std::vector<W
 DropDownMenuButton::~DropDownMenuButton() = default;
 
 void DropDownMenuButton::init(const std::vector<MenuItem>& items, int selected) {
+  entryFace_ = MenuItem::getDefaultColour();
+  entryText_ = Palette().get(Palette::WindowText);
   setStrings(items);
   // A header at the default place is no request; anything else that names no row is refused.
   const bool defaultOnHeader = selected == 0 && MenuItemList::isGroupHeader(data_.items, 0);
@@ -161,8 +164,23 @@ int DropDownMenuButton::react(Event* e) {
   return DropDownButton<DropDownMenu>::react(e);
 }
 
+void DropDownMenuButton::colourEntries() {
+  const Glob* around = parent();
+  const Glib::MenuLook look(around ? around->getPalette() : getPalette());
+  const Colour face = look.itemFace();
+  const Colour text = look.itemText();
+  if (face == entryFace_ && text == entryText_) return;
+  for (MenuItem& it : data_.items) {
+    if (it.col() == entryFace_) it.col(face);
+    if (it.fCol() == entryText_) it.fCol(text);
+  }
+  entryFace_ = face;
+  entryText_ = text;
+}
+
 DropDownMenu* DropDownMenuButton::makeMenu() {
   if (data_.items.empty()) return nullptr;
+  colourEntries();
   const DropDownSettings& s = dropDownSettings();
   DropDownMenu* list;
   if (s.addEntry) {
@@ -175,6 +193,10 @@ DropDownMenu* DropDownMenuButton::makeMenu() {
   if (s.maxVisibleRows >= 0) list->setMaxVisibleRows(s.maxVisibleRows);
   list->restoreGroupStates(s.prefsKey);
   return list;
+}
+
+void DropDownMenuButton::listShown(DropDownMenu* list) {
+  list->scrollToItem(data_.selected);
 }
 
 // --- Settings ---

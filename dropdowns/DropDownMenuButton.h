@@ -102,13 +102,21 @@ class DropDownMenuButton : public DropDownButton<DropDownMenu> {
  protected:
   DropDownMenu* makeMenu() override;
   const char* listKind() const override { return "DropDownMenu"; }
+  // Scrolls the selected entry into view.
+  void listShown(DropDownMenu* list) override;
   // Shows the selection on the face; subclasses with another face override.
   virtual void selectionShown();
 
  private:
   void init(const std::vector<MenuItem>& items, int selected);
+  // Entries left at the default row colours take the look of the palette around the button,
+  // so that a list opened in the light palette is light. Work is done only when that palette's
+  // colours differ from those the entries have.
+  void colourEntries();
 
   DropDownMenuData data_;
   ValServer<int> selected_{-1};
   WString title_;
+  Colour entryFace_;  // the row colours that count as "default" in the entries now
+  Colour entryText_;
 };
