@@ -102,9 +102,10 @@ class DropDownsPageModel : public Glob, public ValClient<int> {
   int gain_ = 42;
 };
 
-TextLabel* statusLine(DropDownsPageModel& m, int x, int y, int w) {
+TextLabel* statusLine(DropDownsPageModel& m, const char* name, int x, int y, int w) {
   auto* l = new TextLabel(L"", m.getPalette(), 0, false, m.canvas());
   l->reshape_canvas(x, y, w, 20);
+  l->set_name(name);
   return l;
 }
 
@@ -168,7 +169,8 @@ void buildDropDowns(DropDownsPageModel& m, int x, int top) {
       new DropDownButtonImposter(L"Imposter", "imposter", at(m, x + kGap + 292, y, 124, 24));
   imposter->setDrawSeparator(true);
 
-  m.status[0] = GlobHandle<TextLabel>(statusLine(m, x + kGap, m.height() - (y + kRow + 20), 440));
+  m.status[0] = GlobHandle<TextLabel>(
+      statusLine(m, "Drop-down values", x + kGap, m.height() - (y + kRow + 20), 440));
 }
 
 void buildCombos(DropDownsPageModel& m, int x, int top) {
@@ -190,7 +192,8 @@ void buildCombos(DropDownsPageModel& m, int x, int top) {
   rate->setNumericEntry(true, 8000, 192000);
   m.rate = GlobHandle<TitledComboBox>(rate);
 
-  m.status[1] = GlobHandle<TextLabel>(statusLine(m, x + kGap, m.height() - (y + kRow + 20), 440));
+  m.status[1] = GlobHandle<TextLabel>(
+      statusLine(m, "Combo values", x + kGap, m.height() - (y + kRow + 20), 440));
 }
 
 void buildGroup(DropDownsPageModel& m, int x, int top) {
@@ -202,7 +205,8 @@ void buildGroup(DropDownsPageModel& m, int x, int top) {
                              g->canvas());
   hint->reshape_canvas(12, 24, 360, 20);
   m.view = GlobHandle<MenuButtonGroup>(g);
-  m.status[2] = GlobHandle<TextLabel>(statusLine(m, x + kGap, m.height() - (top + 164), 440));
+  m.status[2] =
+      GlobHandle<TextLabel>(statusLine(m, "Group value", x + kGap, m.height() - (top + 164), 440));
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 #include "dropdowns/ComboBox.h"
 #include "dropdowns/ComboNumber.h"
 #include "dropdowns/TitledComboBox.h"
+#include "foundation/TabOrderManager.h"
 #include "platform/glob/KeyCodes.h"
 #include "platform/glob/RootGlob.h"
 #include "tests/dropdowns/DropDownTestSupport.h"
@@ -163,6 +164,17 @@ TEST_F(ComboBoxTest, TheSuffixNarrowsTheTextAndTheTitledFormPassesThrough) {
   t->setActive(false, true);
   EXPECT_FALSE(inner->isActive());
   EXPECT_FALSE(inner->textBox()->isActive());
+}
+
+TEST_F(ComboBoxTest, InATabOrderItStandsForItsTextBox) {
+  ComboBox* c = makeCombo({L"A", L"B"});
+  TabOrderManager tabs(false);
+  ASSERT_TRUE(tabs.addTabStop(*c, 0xFFFFFFFE));
+  tabs.setTabStopFocus(0u);
+  EXPECT_TRUE(c->textBox()->hasKbdFocus());
+  tabs.setTabStopFocus(0xFFFFFFFFu);
+  EXPECT_FALSE(c->textBox()->hasKbdFocus());
+  EXPECT_TRUE(parent.hasKbdFocus());
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 #include "dropdowns/DropDownChoices.h"
 #include "dropdowns/MenuWithAddButton.h"
 #include "menus/MenuItemList.h"
+#include "platform/glib/FontCache.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/glob/KeyCodes.h"
 #include "platform/glob/RootGlob.h"
@@ -231,6 +232,36 @@ TEST_F(DropDownButtonTest, GroupStatesAreKeptUnderThePrefsKey) {
   h.click(Harness::centreOf(*b));
   ASSERT_NE(b->dropDown(), nullptr);
   EXPECT_EQ(b->dropDown()->items()[0].type(), CompressedGroupItem);
+}
+
+TEST_F(DropDownButtonTest, AHundredThousandEntriesOpenAtTheSelectionAndStep) {
+  std::vector<WString> entries;
+  entries.reserve(100000);
+  for (int i = 0; i < 100000; ++i) entries.push_back(L"Entry " + std::to_wstring(i));
+  DropDownMenuButton* b = make(entries);
+  ASSERT_TRUE(b->setSelectedItem(99998));
+  h.click(Harness::centreOf(*b));
+  DropDownMenu* list = b->dropDown();
+  ASSERT_NE(list, nullptr);
+  EXPECT_LE(list->canvas()->rootRect().height(), 300);  // scrolls inside the screen
+  ASSERT_FALSE(list->itemArea(99998).empty());          // opened where the selection is
+  h.click(rowCentre(list, 99997));
+  EXPECT_EQ(b->getSelectedItem(), 99997);
+  h.wheel(Harness::centreOf(*b), -1);
+  h.wheel(Harness::centreOf(*b), -1);
+  EXPECT_EQ(b->getSelectedItem(), 99999);
+  h.wheel(Harness::centreOf(*b), -1);  // at the last entry: no wrap
+  EXPECT_EQ(b->getSelectedItem(), 99999);
+}
+
+TEST_F(DropDownButtonTest, AutoSizeFitsTheWidestEntry) {
+  DropDownMenuButton* b = make({L"A", L"A much longer entry than the rest", L"B"});
+  const Glib::FontPtr f = Glib::fonts().standard();
+  const int x0 = b->canvas()->rect().x0;
+  b->autoSize();
+  EXPECT_EQ(b->width(), DropDownMenuButton::calcWidth(L"A much longer entry than the rest", *f));
+  EXPECT_EQ(b->canvas()->rect().x0, x0);
+  EXPECT_GT(DropDownMenuButton::calcWidth(L"AB", *f), DropDownMenuButton::calcWidth(L"A", *f));
 }
 
 }  // namespace
