@@ -9,6 +9,7 @@
 //   message from the open list       -                            handleDropDownMessage; when
 //                                                                 it says so, the list goes
 //   "menu_poot" from anyone          up                           up; the list closes
+//   setActive(false)                 -                            up; the list closes
 //
 // A list counts as open only while its handle is alive and the object is of T's kind: a list
 // destroyed behind the button's back is forgotten, and the next press opens a new one (the
@@ -106,6 +107,12 @@ class DropDownButton : public Button {
       removeMenuFromScreen();
     }
     if (wasOpen && newState == kButtonUp && !silent && self) handleSecondClick();
+  }
+
+  // A button made inactive closes its list.
+  void setActive(bool active, bool redraw) override {
+    if (!active) removeMenuFromScreen();
+    Button::setActive(active, redraw);
   }
 
   int react(Event* e) override {

@@ -4,6 +4,7 @@
 
 #include "platform/glib/look/DropDownLook.h"
 #include "platform/glib/look/MenuLook.h"
+#include "platform/glob/KeyCodes.h"
 
 namespace {
 
@@ -35,6 +36,14 @@ bool DropDownMenu::m_is_type(const char* type) const {
   // Still a pop-up menu to everything that looks for one.
   return type && (std::strcmp(type, idstring()) == 0 || Menu::m_is_type(type) ||
                   std::strcmp(type, "menu") == 0);
+}
+
+int DropDownMenu::react(Event* e) {
+  if (key_press_event(e) && e->keyCode() == kKeyEscape) {
+    send_message_event(this, this, kPootMsg);  // closes: nothing of it is touched after
+    return 1;
+  }
+  return Menu::react(e);
 }
 
 void DropDownMenu::valChangedNtfy() {

@@ -5,7 +5,8 @@
 // tick and the embossed text style (TextStyles value 2).
 //
 // Decisions where the behaviour was left open:
-// - No title strip; a press outside closes it, as any pop-up.
+// - No title strip; a press outside closes it, as any pop-up, and so does Escape (keys go to
+//   the open list, the screen's input scope); other keys are left alone.
 // - Its drop-down scrolls the selected entry into view when it opens on a long list.
 #include "menus/DropDownMenuData.h"
 #include "menus/Menu.h"
@@ -23,6 +24,7 @@ class DropDownMenu : public Menu, public ValClient<int> {
 
   const char* idstring() const override { return "DropDownMenu"; }
   bool m_is_type(const char* type) const override;
+  int react(Event* e) override;
   void valChangedNtfy() override;
 
  protected:

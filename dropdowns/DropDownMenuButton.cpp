@@ -149,6 +149,10 @@ void DropDownMenuButton::handleMouseWheelDelta(int delta) {
   if (setSelectedItem(next) && self) informOwner();
 }
 
+void DropDownMenuButton::setNewWidgetValue(WString& value) {
+  if (value != getSelectedItemNameW()) setSelectedItem(value);
+}
+
 int DropDownMenuButton::react(Event* e) {
   if (mouse_wheel_event(e)) {
     if (getWheelEnabled() && e->wheelSteps() != 0) handleMouseWheelDelta(e->wheelSteps());

@@ -96,6 +96,9 @@ class DropDownMenuButton : public DropDownButton<DropDownMenu> {
   virtual void informOwner();
   virtual void handleMouseWheelDelta(int delta);
 
+  // The widget value is the selected entry's name: a name pushed from the model selects its
+  // entry; a name no entry shows is refused and the selection kept.
+  void setNewWidgetValue(WString& value) override;
   int react(Event* e) override;
   const char* idstring() const override { return "ddmenubutton"; }
 

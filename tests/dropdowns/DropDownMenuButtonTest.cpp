@@ -254,6 +254,32 @@ TEST_F(DropDownButtonTest, AHundredThousandEntriesOpenAtTheSelectionAndStep) {
   EXPECT_EQ(b->getSelectedItem(), 99999);
 }
 
+TEST_F(DropDownButtonTest, EscapeDeactivationAndTheModelCloseOrSet) {
+  DropDownMenuButton* b = make({L"Red", L"Green"});
+  h.click(Harness::centreOf(*b));
+  ASSERT_TRUE(b->isDropDownValid());
+  h.key(kKeyEscape);  // keys go to the open list
+  EXPECT_FALSE(b->isDropDownValid());
+  EXPECT_EQ(b->get_state(), kButtonUp);
+  EXPECT_EQ(b->getSelectedItem(), 0);
+
+  h.click(Harness::centreOf(*b));
+  ASSERT_TRUE(b->isDropDownValid());
+  b->setActive(false, true);
+  EXPECT_FALSE(b->isDropDownValid());
+  EXPECT_EQ(countKind("menu"), 0);
+  EXPECT_EQ(b->get_state(), kButtonUp);
+  b->setActive(true, true);
+
+  // A name pushed from a model selects its entry; an unknown one is refused.
+  WString green = L"Green", purple = L"Purple";
+  b->setNewWidgetValue(green);
+  EXPECT_EQ(b->getSelectedItem(), 1);
+  b->setNewWidgetValue(purple);
+  EXPECT_EQ(b->getSelectedItem(), 1);
+  EXPECT_EQ(b->getWidgetValue(), L"Green");
+}
+
 TEST_F(DropDownButtonTest, AutoSizeFitsTheWidestEntry) {
   DropDownMenuButton* b = make({L"A", L"A much longer entry than the rest", L"B"});
   const Glib::FontPtr f = Glib::fonts().standard();
