@@ -20,6 +20,7 @@ void buildChecksPage(GalleryPage& page);
 void buildTextPage(GalleryPage& page);
 void buildLabelsPage(GalleryPage& page);
 void buildMenusPage(GalleryPage& page);
+void buildDropDownsPage(GalleryPage& page);
 void buildValuesPage(GalleryPage& page);
 void buildSlidersPage(GalleryPage& page);
 void buildListsPage(GalleryPage& page);

@@ -4,6 +4,7 @@
 #include <cstdio>
 
 #include "buttons/ImageButton.h"
+#include "dropdowns/DropDownMenuButton.h"
 #include "foundation/ListViewAdaptorBase.h"
 #include "foundation/MenuGlob.h"
 #include "menus/MenuDismisser.h"
@@ -185,6 +186,9 @@ bool Menu::setCurrentChoice(const WString& label, uint64_t n) {
   const int i = MenuItemList::findByDisplayString(items_, label);
   if (i < 0 || n >= items_[i].options().size() || items_[i].curOption() == n) return false;
   items_[i].setCurOption(n);
+  if (auto* dd = dynamic_cast<DropDownMenuButton*>(widgetForItem(i))) {
+    dd->setSelectedItem(static_cast<int>(n));
+  }
   redrawItem(i);
   return true;
 }
@@ -252,6 +256,7 @@ void Menu::rebuildRows() {
   rows_.clear();
   rows_.reserve(items_.size());
   iconicCount_ = 0;
+  choiceCount_ = 0;
   bool closed = false;  // the nearest header above is compressed
   for (size_t i = 0; i < items_.size(); ++i) {
     const MenuItemType t = items_[i].type();
@@ -259,6 +264,7 @@ void Menu::rebuildRows() {
       ++iconicCount_;
       continue;
     }
+    if (!items_[i].options().empty()) ++choiceCount_;
     if (t == ExpandedGroupItem || t == CompressedGroupItem) closed = t == CompressedGroupItem;
     if (t != GroupedMenuItem || !closed) rows_.push_back(static_cast<int>(i));
   }
@@ -348,7 +354,8 @@ void Menu::relayout() {
   }
   int k = 0;
   for (const auto& [index, g] : widgets_) {
-    if (Glob* b = g.get()) {
+    Glob* b = g.get();
+    if (b && items_[index].type() == IconicMenuItem) {
       b->reshape_canvas(2 + k * (kIconSize + 2), rowsTop() + 2, kIconSize, kIconSize);
       ++k;
     }
@@ -390,6 +397,25 @@ void Menu::rebuildVisible() {
     if (rowTop <= 0) break;
     visible_.push_back(VisibleMenuItem{Kw::Box<int>(1, rowTop - ih, right, rowTop), rows_[r]});
   }
+  if (choiceCount_ > 0) placeChoiceWidgets();
+}
+
+void Menu::placeChoiceWidgets() {
+  for (const auto& [index, g] : widgets_) {
+    Glob* dd = g.get();
+    if (!dd || items_[index].type() == IconicMenuItem) continue;
+    const Kw::Box<int> area = itemArea(index);
+    if (area.height() < itemHeight_) {
+      dd->unmap_canvas();  // a row scrolled partly or wholly out of view hides its drop-down
+      continue;
+    }
+    const Glib::FontPtr f = fontFor(items_[index]);
+    int widest = 0;
+    for (const WString& o : items_[index].options()) widest = std::max(widest, f->textWidth(o));
+    const int w = std::min(area.width() / 2, widest + kChoiceMarkRoom + kRightMargin + 16);
+    dd->reshape_canvas(area.x1 - w, area.y0 + 1, w - 1, area.height() - 2);
+    dd->map_canvas();
+  }
 }
 
 bool Menu::setScrollOffset(int offset) {
@@ -402,6 +428,19 @@ bool Menu::setScrollOffset(int offset) {
   calcHighlightItem(pointerInside());
   update(Kw::Box<int>(0, 0, rowsRight(), rowsTop()));
   refresh_on();
+  return true;
+}
+
+bool Menu::scrollToItem(int index) {
+  const auto at = std::lower_bound(rows_.begin(), rows_.end(), index);
+  if (at == rows_.end() || *at != index) return false;
+  const int top = static_cast<int>(at - rows_.begin()) * itemHeight_;
+  const int room = visibleRowCount() * itemHeight_;
+  if (top < scrollOffset_) {
+    setScrollOffset(top);
+  } else if (top + itemHeight_ > scrollOffset_ + room) {
+    setScrollOffset(top + itemHeight_ - room);
+  }
   return true;
 }
 
@@ -424,8 +463,19 @@ int Menu::findItemAtPos(const XY<int>& pos) const {
 
 void Menu::createWidgetsForItems() {
   destroyWidgets();
-  if (iconicCount_ == 0) return;
+  if (iconicCount_ == 0 && choiceCount_ == 0) return;
   for (size_t i = 0; i < items_.size(); ++i) {
+    if (!items_[i].options().empty() && items_[i].type() != IconicMenuItem) {
+      auto* dd =
+          new DropDownMenuButton(WString(), items_[i].options(), GlobCreationInfo(1, 1, canvas()));
+      dd->set_style(kButtonStyleFlat);
+      dd->setCol(items_[i].col(), false);
+      dd->setSelectedItem(static_cast<int>(items_[i].curOption()));
+      dd->setActive(items_[i].getActive(), false);
+      dd->unmap_canvas();  // placeChoiceWidgets shows it with its row
+      widgets_.emplace_back(static_cast<int>(i), GlobHandle<>(dd));
+      continue;
+    }
     if (items_[i].type() != IconicMenuItem) continue;
     const WString& label = items_[i].label();
     const size_t comma = label.find(L',');
@@ -592,6 +642,10 @@ int Menu::handleMessageEvent(const String& msg, Glob* sender) {
     chooseIconic(index);
     return 1;
   }
+  if (index >= 0 && msg == DropDownMenuButton::dropDownMenuButtonMsg) {
+    chooseFromDropDown(index, sender);
+    return 1;
+  }
   return handleScrollBarMessages(msg);
 }
 
@@ -647,8 +701,23 @@ void Menu::chooseItem(int index) {
   if (!it.getActive() || it.getDisplayString().empty()) return;
   if (!it.options().empty()) {
     it.incCurOption();
+    if (auto* dd = dynamic_cast<DropDownMenuButton*>(widgetForItem(index))) {
+      dd->setSelectedItem(static_cast<int>(it.curOption()));
+    }
     redrawItem(index);
   }
+  const bool keepOpen = (it.getFlags() & MenuItem::kStaysOpen) != 0;
+  if (!tellOwner(it.msg())) return;
+  closeAfterChoice(keepOpen);
+}
+
+void Menu::chooseFromDropDown(int index, Glob* dropDown) {
+  auto* dd = dynamic_cast<DropDownMenuButton*>(dropDown);
+  MenuItem& it = items_[index];
+  if (!dd || it.options().empty()) return;
+  const int choice = dd->getSelectedItem();
+  if (choice >= 0) it.setCurOption(static_cast<uint64_t>(choice));
+  redrawItem(index);
   const bool keepOpen = (it.getFlags() & MenuItem::kStaysOpen) != 0;
   if (!tellOwner(it.msg())) return;
   closeAfterChoice(keepOpen);

@@ -11,6 +11,8 @@
 //                                  the item's message; the pop-up closes unless pinned (then
 //                                  "menu_itemSelected") or the item keeps it open
 //   click on an iconic button      the owner gets the item's message; closes unless pinned
+//   choice from a row's drop-down  the item takes the option; the owner gets the item's
+//                                  message; closes unless pinned or the item keeps it open
 //   wheel over the rows            scrolls by one row per step
 //   scroll bar                     "thumbMoved" sets the offset; its arrows step one row
 //   press outside the pop-up       closes it
@@ -36,6 +38,8 @@
 // - Any item whose flag bit 1 is set keeps the pop-up open when chosen, as pinning does, and
 //   the owner then hears "menu_itemSelected" too.
 // - The tooltip of a row is the Glob's context string, so the screen's tooltip shows it.
+// - A multi-choice row's drop-down (a flat DropDownMenuButton over its options) covers the
+//   right-hand part of the row, in the row's colour; it shows only while its row does.
 #include <vector>
 
 #include "foundation/ListViewWidget.h"
@@ -135,7 +139,10 @@ class Menu : public Glob, public ListViewWidget {
   // The row box of item `index` when it is on screen; an empty box otherwise.
   Kw::Box<int> itemArea(int index) const;
   int findItemAtPos(const XY<int>& pos) const;
-  // The widget made for item `index` (an iconic item's button), or null.
+  // Scrolls as little as needed for item `index` to show whole; false when it is no row.
+  bool scrollToItem(int index);
+  // The widget made for item `index` (an iconic item's button, a multi-choice row's
+  // drop-down), or null.
   Glob* widgetForItem(int index) const;
   int findItemFromWidget(const Glob* widget) const;
   virtual int calculateHeight() const;
@@ -182,6 +189,9 @@ class Menu : public Glob, public ListViewWidget {
   void rebuildVisible();
   void createWidgetsForItems();
   void destroyWidgets();
+  // Puts each multi-choice row's drop-down over its row, or hides it with its row.
+  void placeChoiceWidgets();
+  void chooseFromDropDown(int index, Glob* dropDown);
   int measureWidth() const;
   // Sets the size and the scroll bar from the items; keeps the top edge where it is.
   void relayout();
@@ -228,8 +238,9 @@ class Menu : public Glob, public ListViewWidget {
 
   std::vector<int> rows_;  // the item index of every non-hidden row, in order
   int iconicCount_ = 0;
+  int choiceCount_ = 0;                                // items with options
   int contentWidth_ = 0;                               // measureWidth() as of the last rebuild
-  std::vector<std::pair<int, GlobHandle<>>> widgets_;  // iconic items' buttons, by item index
+  std::vector<std::pair<int, GlobHandle<>>> widgets_;  // rows' own widgets, by item index
   GlobHandle<> scrollBar_;                             // a ScrollBar
   GlobHandle<> dismisser_;                             // a MenuDismisser
   unsigned flags_ = MenuData::kCloseOnOutsideClick | MenuData::kShowTitle;

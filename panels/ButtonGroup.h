@@ -7,7 +7,7 @@
 //   which passes every message from it on to its own parent unchanged, as its own.
 // - The button is the title widget, as wide as its label needs plus the arrow; the group's
 //   title is its label.
-#include "panels/DropDownButtonImposter.h"
+#include "dropdowns/DropDownButtonImposter.h"
 #include "panels/WidgetGroupEx.h"
 
 class ButtonGroup : public WidgetGroupEx {

@@ -205,7 +205,7 @@ TEST_F(MenuPopup, MultiChoiceRowsCycleAndTheOwnerKeepsTheChoice) {
   EXPECT_FALSE(owner->setMenuItemChoice(L"Zoom", 3));
   EXPECT_EQ(owner->getMenuItemChoice(L"Zoom"), L"200%");
 
-  h.click(rowCentre(m, 0));  // wraps to the first option, reports and closes
+  h.click(rowLabel(m, 0));  // wraps to the first option, reports and closes
   EXPECT_EQ(owner->heard, (std::vector<String>{"zoom", Menu::pootMsg_}));
   EXPECT_EQ(owner->menuItems()[0].curOption(), 0u);
   EXPECT_EQ(owner->getMenuItemChoice(L"Zoom"), L"");  // no pop-up open
@@ -218,7 +218,7 @@ TEST_F(MenuPopup, ItemsThatStayOpenAndPinnedPopUps) {
   owner->addMenuItem(L"Plain", "plain");
   Menu* m = openAt(XY<int>(60, 150));
   ASSERT_NE(m, nullptr);
-  h.click(rowCentre(m, 0));
+  h.click(rowLabel(m, 0));
   EXPECT_EQ(owner->openMenu(), m);
   EXPECT_EQ(m->getCurrentChoice(L"Mode"), L"b");
   EXPECT_EQ(owner->heard, (std::vector<String>{"mode", Menu::itemSelectedMsg_}));

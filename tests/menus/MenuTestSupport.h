@@ -51,6 +51,13 @@ class MenuFixture : public ::testing::Test {
     return XY<int>(o.x + (a.x0 + a.x1) / 2, o.y + (a.y0 + a.y1) / 2);
   }
 
+  // A point on the label of the row of item `index`, clear of a multi-choice row's drop-down.
+  XY<int> rowLabel(const Menu* m, int index) const {
+    const Kw::Box<int> a = m->itemArea(index);
+    const XY<int> o = m->canvas()->rootOrigin();
+    return XY<int>(o.x + a.x0 + Menu::kGlyphColumn + 4, o.y + (a.y0 + a.y1) / 2);
+  }
+
   Harness h;
   RecordingOwner* owner;
 };

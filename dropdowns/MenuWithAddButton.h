@@ -1,0 +1,29 @@
+#pragma once
+// A drop-down's list with an add row at its foot: pressing it tells the list's owner "MenuAdd"
+// and closes the list. The drop-down passes "MenuAdd" on to its own owner, which adds the
+// entry its own way.
+//
+// Decisions where the behaviour was left open:
+// - The add row is a flat button (message "MenuAdd") across the foot of the list,
+//   Glib::DropDownLook::kAddRowHeight pixels high, labelled kDefaultAddLabel unless told.
+#include "dropdowns/DropDownMenu.h"
+
+class Button;
+
+class MenuWithAddButton : public DropDownMenu {
+ public:
+  static const char* const AddMsg_;  // "MenuAdd"
+  static constexpr const wchar_t* kDefaultAddLabel = L"Add...";
+
+  MenuWithAddButton(const DropDownMenuData& data, Glob* owner, int width,
+                    const WString& addLabel = kDefaultAddLabel,
+                    ValServer<int>* selection = nullptr);
+
+  Button* addButton() const;
+  int calculateHeight() const override;
+  int react(Event* e) override;
+  void reshape() override;
+
+ private:
+  GlobHandle<> addButton_;
+};
