@@ -1,5 +1,6 @@
 #include "buttons/Button.h"
 
+#include "platform/glob/BoxRegion.h"
 #include "platform/glob/KeyCodes.h"
 
 #include <climits>
@@ -588,4 +589,10 @@ int Button::drawIcon(Glib::Painter& p, const Glib::Image& img, bool alone) {
 
 Colour Button::edgeColour() {
   return Glib::ButtonLook(getPalette()).edge(hasKeyboardFocus());
+}
+
+Kw::Ptr<iRegion> Button::path() {
+  auto* outline = new BoxRegion(facepath());
+  outline->add(addpath());
+  return Kw::Ptr<iRegion>(outline);
 }

@@ -99,6 +99,8 @@ class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
 
   // --- Glob ---
   int react(Event* e) override;
+  // The face and whatever a subclass adds round it (facepath, addpath).
+  Kw::Ptr<iRegion> path() override;
   void handle_kbd_focus() override;
   void setActive(bool active, bool redraw) override;
   // Sets the face colour of both states.

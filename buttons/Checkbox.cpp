@@ -64,6 +64,8 @@ Checkbox::~Checkbox() = default;
 void Checkbox::init(bool initialTicked) {
   ticked = initialTicked;
   settings_.reset();
+  // A box's place is its panel's business: saved layouts leave it out.
+  set_dumpable(0);
   clicksEnabled = true;
   userFunction = nullptr;
   userData = nullptr;

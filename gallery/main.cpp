@@ -7,11 +7,17 @@
 #include <cstdio>
 #include <memory>
 
+#include "gallery/ColourChip.h"
+#include "gallery/ColourWell.h"
 #include "gallery/GalleryApp.h"
 #include "gallery/GalleryOptions.h"
 #include "gallery/TreeDump.h"
+#include "panels/StandardPanel.h"
 #include "platform/backend/HeadlessBackend.h"
 #include "platform/backend/WindowBackend.h"
+#include "platform/glob/GlobHandle.h"
+#include "platform/glob/GlobLayoutFile.h"
+#include "platform/misc/EditorPreferences.h"
 #include "text/KwToolTip.h"
 #include "text/PanelTitleTextBox.h"
 
@@ -30,6 +36,37 @@ String slug(const String& title) {
   }
   while (!out.empty() && out.back() == '-') out.pop_back();
   return out;
+}
+
+// The gallery's saved panel layout, in the folder of the user's preferences; empty when there
+// is no such folder.
+String layoutPath() {
+  const String prefsFile = EditorPreferences::defaultPath();
+  const size_t slash = prefsFile.rfind('/');
+  return slash == String::npos ? String() : prefsFile.substr(0, slash + 1) + "gallery-layout";
+}
+
+// A panel moved by its title strip, with colours to drag onto a well.
+Glob* makeDragDropPanel(RootGlob& screen) {
+  constexpr int kWidth = 196, kHeight = 92, kChip = 30;
+  auto* panel = new StandardPanel(
+      GlobCreationInfo(kWidth, kHeight, screen.canvas(), screen.width() - kWidth - 12, 224));
+  panel->set_name("Drag and drop");
+  panel->setBorderStyle(UifBorderRaised);
+  panel->addStandardWidgets(StdPinButton);
+  panel->set_movable(1);
+  const uint32_t colours[] = {0xD9534F, 0x5CB85C, 0x428BCA};
+  int x = 12;
+  for (uint32_t rgb : colours) {
+    auto* chip = new ColourChip(GlobCreationInfo(kChip, kChip, panel->canvas()), rgb);
+    chip->set_name(ColourChip::hexOf(rgb));
+    panel->addWidget(chip, x, 14);
+    x += kChip + 8;
+  }
+  auto* well = new ColourWell(GlobCreationInfo(50, kChip + 10, panel->canvas()), 0x808080);
+  well->set_name("Colour well");
+  panel->addWidget(well, kWidth - 62, 9);
+  return panel;
 }
 
 int writeScreenshots(Backend& screen, GalleryApp& app, const String& dir) {
@@ -84,6 +121,14 @@ int main(int argc, char** argv) {
   screen.root().setPalette(options.palette);
 
   auto app = std::make_unique<GalleryApp>(screen.root(), log);
+  // The floating panel the user may move; where it was left is kept next to the preferences.
+  GlobHandle<> dragPanel(makeDragDropPanel(screen.root()));
+  GlobLayoutFile layout(layoutPath(), "globkit-gallery");
+  if (!layout.path().empty() && !layout.restore({dragPanel.get()}) &&
+      layout.lastError() != "no saved layout") {
+    std::fprintf(stderr, "globkit-gallery: saved layout not used (%s)\n",
+                 layout.lastError().c_str());
+  }
   // Help under the pointer for every control of every page.
   KwToolTip::registerTypes(screen.root());
   for (int i = 0; i < app->pageCount() && !options.startPage.empty(); ++i) {
@@ -110,6 +155,7 @@ int main(int argc, char** argv) {
       status = 1;
     }
   }
+  if (window && !layout.path().empty() && dragPanel) layout.save({dragPanel.get()});
   app.reset();
   return status;
 }

@@ -1,7 +1,8 @@
 #pragma once
 // The small vocabulary of panel layout: border styles, the eight placement origins, the
 // surround a panel draws round a child, the relations and alignments of relative placement,
-// the standard-widget flags and the two sizes a panel can show.
+// the standard-widget flags; the two sizes a panel can show are the framework's size_state.
+#include "platform/glob/SizeState.h"
 
 // Border styles. The numbers are the ones stored in configuration records; a value outside
 // this list is accepted and draws no border (width 0).
@@ -67,9 +68,3 @@ constexpr int kStdTitleStripFlags = StdPootButton | StdSettingsButton | StdSizeB
                                     StdPinButton | StdTitleBox | StdEditableTitleBox;
 constexpr int kStdBottomStripFlags = StdDoItButton;
 constexpr int kStdAllFlags = kStdTitleStripFlags | kStdBottomStripFlags;
-
-// The two sizes a panel with a size button shows.
-enum size_state : int {
-  SizeFull = 0,
-  SizeMinimised = 1,  // only the border and the title strip
-};

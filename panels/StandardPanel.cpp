@@ -167,6 +167,16 @@ void StandardPanel::reshape_canvas(int x, int y, int width, int height) {
   rect::reshape_canvas(x, y, width, height);
 }
 
+bool StandardPanel::isMoveHandleAt(const XY<int>& pos) {
+  if (!PanelGeometry::hasTitleStrip(std_->flags())) return true;
+  return PanelGeometry::titleStrip(frame()).contains(pos);
+}
+
+XY<int> StandardPanel::minimumSize() const {
+  const XY<int> own = rect::minimumSize();
+  return XY<int>(std::max(own.x, minSize_.x), std::max(own.y, minSize_.y));
+}
+
 void StandardPanel::reshape() {
   recalculateWidgetPositions();
   update();
@@ -196,6 +206,7 @@ void StandardPanel::applySizeState(size_state state) {
       hiddenByMinimise_.emplace_back(g);
     }
     sizeState_ = state;
+    setSizeState(state);
     const int h =
         2 * calcBorderSize(border_) + (PanelGeometry::hasTitleStrip(getStandardWidgetFlags())
                                            ? PanelGeometry::kTitleStripHeight
@@ -203,6 +214,7 @@ void StandardPanel::applySizeState(size_state state) {
     reshape_canvas(r.x0, r.y1 - h, r.width(), h);
   } else {
     sizeState_ = state;
+    setSizeState(state);
     reshape_canvas(r.x0, r.y1 - fullHeight_, r.width(), fullHeight_);
     for (const GlobHandle<>& h : hiddenByMinimise_) {
       if (Glob* g = h.get()) g->map_canvas();

@@ -125,6 +125,9 @@ class StandardPanel : public rect {
   void reshape_canvas(int x, int y, int width, int height) override;
   const char* idstring() const override { return "standard_panel"; }
   String describeValue() const override { return getTitle(); }
+  // A panel with a title strip is moved by it; one without, from anywhere.
+  bool isMoveHandleAt(const XY<int>& pos) override;
+  XY<int> minimumSize() const override;
 
   // --- Layout queries; the static forms work from a frame description ---
   static XY<int> getOriginXY(CoordinateOrigin origin, int flags, XY<int> size,

@@ -21,8 +21,11 @@ SDL_SystemCursor SdlCursorSet::systemCursorFor(MouseCursorID id, bool& hidden) {
       return SDL_SYSTEM_CURSOR_WAIT;
     case kCursorHand:
       return SDL_SYSTEM_CURSOR_HAND;
-    // A value follows the pointer in either direction.
+    case kCursorResizeCorner:
+      return SDL_SYSTEM_CURSOR_SIZENWSE;
+    // A value, or a whole object, follows the pointer in either direction.
     case kCursorValueDrag:
+    case kCursorMove:
       return SDL_SYSTEM_CURSOR_SIZEALL;
     default:
       return SDL_SYSTEM_CURSOR_ARROW;

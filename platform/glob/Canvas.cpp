@@ -17,7 +17,9 @@ Canvas::Canvas(Canvas* parent, CanvasClient* client, const Kw::Box<int>& rectInP
 }
 
 Canvas::Canvas(CanvasHost* host, CanvasClient* client, int width, int height)
-    : client_(client), host_(host), rect_(0, 0, width, height) {}
+    : client_(client), rect_(0, 0, width, height), rare_(std::make_unique<Rare>()) {
+  rare_->host = host;
+}
 
 Canvas::~Canvas() {
   // Children still attached belong to someone else; they become unattached.
@@ -52,12 +54,13 @@ void Canvas::forgetSubtree() {
 }
 
 const ChildIndex& Canvas::index() const {
-  if (!index_) index_ = std::make_unique<ChildIndex>();
+  if (!rare_) rare_ = std::make_unique<Rare>();
+  if (!rare_->index) rare_->index = std::make_unique<ChildIndex>();
   if (indexDirty_) {
-    index_->rebuild(children_, localBounds());
+    rare_->index->rebuild(children_, localBounds());
     indexDirty_ = false;
   }
-  return *index_;
+  return *rare_->index;
 }
 
 void Canvas::childrenChanged() {
@@ -196,7 +199,7 @@ Canvas* Canvas::root() {
 CanvasHost* Canvas::host() const {
   const Canvas* c = this;
   while (c->parent_) c = c->parent_;
-  return c->host_;
+  return c->rare_ ? c->rare_->host : nullptr;
 }
 
 PaintSession* Canvas::paintSession() const {

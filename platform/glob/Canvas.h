@@ -70,7 +70,7 @@ class Canvas {
 
   // The root canvas above this one, or null when the canvas is unattached.
   Canvas* root();
-  bool isRoot() const { return host_ != nullptr; }
+  bool isRoot() const { return rare_ && rare_->host; }
   CanvasHost* host() const;
   PaintSession* paintSession() const;
 
@@ -87,14 +87,20 @@ class Canvas {
   // The index of the children, brought up to date; made when first needed.
   const ChildIndex& index() const;
 
+  // What few canvases need: the screen's host, and the index of a crowded parent. Kept apart so
+  // that the many canvases without either pay one pointer.
+  struct Rare {
+    CanvasHost* host = nullptr;
+    std::unique_ptr<ChildIndex> index;
+  };
+
   Canvas* parent_ = nullptr;
   CanvasClient* client_ = nullptr;
-  CanvasHost* host_ = nullptr;
   Kw::Box<int> rect_;
   bool mapped_ = true;
   bool opaque_ = false;
   bool tearingDown_ = false;
-  std::vector<Canvas*> children_;
-  mutable std::unique_ptr<ChildIndex> index_;
   mutable bool indexDirty_ = true;
+  std::vector<Canvas*> children_;
+  mutable std::unique_ptr<Rare> rare_;
 };

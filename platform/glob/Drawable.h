@@ -1,12 +1,11 @@
 #pragma once
 // Something that paints itself when asked. update() only records what needs repainting;
 // painting happens later, once per frame, and is held back while redraws are disabled.
+// Its table is update, draw, canDraw; it is never deleted through this face.
 #include "platform/kw/Box.h"
 
 class Drawable {
  public:
-  virtual ~Drawable() = default;
-
   // Marks the whole face as needing a repaint.
   virtual void update() = 0;
   // Paints the face. Called by the framework during a repaint, clipped to what is damaged.
@@ -19,6 +18,9 @@ class Drawable {
   static void disableRedraws();
   static void enableRedraws();
   static bool redrawsEnabled();
+
+ protected:
+  ~Drawable() = default;
 };
 
 // The older spelling of the same batching, with a separate count; painting waits for both.

@@ -38,6 +38,7 @@ Glob::Glob(CanvasHost* host, int width, int height)
     : canvas_(host, this, width, height), serial_(GlobRegistry::enter(this)) {}
 
 Glob::~Glob() {
+  while (isFrozen()) unfreeze();
   GlobRegistry::leave(this, serial_);
   canvas_.beginTeardown();
   deleteChildren();
@@ -80,6 +81,13 @@ Glob* Glob::globOf(const Canvas* c) {
   return g && GlobRegistry::isLive(g, g->serial_) ? g : nullptr;
 }
 
+unsigned short Glob::old_height() const {
+  return extras_ && extras_->hasOldSize ? extras_->oldHeight : height();
+}
+unsigned short Glob::old_width() const {
+  return extras_ && extras_->hasOldSize ? extras_->oldWidth : width();
+}
+
 Glob* Glob::parent() const {
   for (Canvas* c = canvas_.parent(); c; c = c->parent()) {
     if (Glob* g = globOf(c)) return g;
@@ -92,10 +100,6 @@ unsigned short Glob::height() const {
 }
 unsigned short Glob::width() const {
   return static_cast<unsigned short>(canvas_.width());
-}
-
-int Glob::react(Event*) {
-  return 0;
 }
 
 void Glob::set_interest(int mask) {
@@ -125,16 +129,23 @@ void Glob::unmap_canvas() {
 
 void Glob::reshape_canvas(int x, int y, int width, int height) {
   const bool resized = width != canvas_.width() || height != canvas_.height();
+  if (resized) {
+    Extras& ex = extras();
+    ex.oldWidth = this->width();
+    ex.oldHeight = this->height();
+    ex.hasOldSize = true;
+  }
   canvas_.reshape(Kw::Box<int>::fromSize(x, y, std::max(0, width), std::max(0, height)));
-  if (resized) reshape();
+  if (!resized) return;
+  if (frozenHolder()) {
+    layoutOwed_ = true;
+    return;
+  }
+  reshape();
 }
 
 void Glob::translate_canvas(int dx, int dy) {
   canvas_.translate(dx, dy);
-}
-
-int Glob::child_count() const {
-  return static_cast<int>(children().size());
 }
 
 void Glob::set_kbd_focus() {
@@ -187,7 +198,9 @@ void Glob::setCol(const Colour& colour, bool redraw) {
 }
 
 void Glob::detachFromParent() {
+  if (!canvas_.parent()) return;
   canvas_.reparent(nullptr);
+  set_canvas();
 }
 
 bool Glob::m_is_type(const char* type) const {
@@ -198,15 +211,19 @@ String Glob::contextString(const XY<int>&, CanvasClient*) {
   return extras_ ? extras_->contextText : String();
 }
 
-MouseCursorID Glob::contextCursor(const XY<int>&) {
-  return defaultCursor();
-}
-
 void Glob::update() {
+  if (Glob* holder = frozenHolder()) {
+    holder->redrawOwed_ = true;
+    return;
+  }
   canvas_.damage();
 }
 
 void Glob::update(const Kw::Box<int>& localArea) {
+  if (Glob* holder = frozenHolder()) {
+    holder->redrawOwed_ = true;
+    return;
+  }
   canvas_.damage(localArea);
 }
 

@@ -12,4 +12,6 @@ enum MouseCursorID : int {
   kCursorValueDrag = 21,  // dragging changes a value
   kCursorHorizontalMove = 22,
   kCursorVerticalMove = 23,
+  kCursorResizeCorner = 24,  // the corner handle that resizes both ways
+  kCursorMove = 25,          // the whole object moves with the pointer
 };

@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "platform/glob/GlobDragSession.h"
+#include "platform/glob/GlobMoveSession.h"
 #include "platform/glob/RuntimeClock.h"
 #include "platform/misc/Diagnostics.h"
 
@@ -17,6 +19,8 @@ RootGlob::~RootGlob() {
   deleteChildren();
   queue_.clear();
   tickers_.clear();
+  move_.reset();
+  drag_.reset();
 }
 
 // --- Input ---
@@ -72,6 +76,7 @@ void RootGlob::injectMouse(int type, XY<int> pos, int wheelSteps) {
   if (mouse_down_event(&probe)) {
     buttonsDown_ |= button == 0x80 ? 0x60 : button;
     pressPos_ = pos;
+    dragAsked_ = false;
     target = grab_.get() ? grab_.get() : under;
     if (!grab_.get()) grab_ = GlobHandle<>(under);
   } else if (mouse_up_event(&probe)) {
@@ -84,6 +89,7 @@ void RootGlob::injectMouse(int type, XY<int> pos, int wheelSteps) {
     target = grab_.get() ? grab_.get() : under;
   }
   e.pressPos = pressPos_;
+  if (routeToSessions(probe, pos, e)) return;
   if (!target) return;
   const XY<int> o = target->canvas()->rootOrigin();
   e.pos = pos - o;
@@ -117,6 +123,118 @@ int RootGlob::deliver(Event& e, Glob* target, bool bubble) {
     h = GlobHandle<>(target);
   }
   return 0;
+}
+
+// --- User moves, resizes and drags ---
+
+bool RootGlob::routeToSessions(const Event& probe, XY<int> pos, Event& e) {
+  const bool leftUp = mouse_up_event(&probe) && mouse_left_event(&probe);
+  const bool move =
+      !mouse_down_event(&probe) && !mouse_up_event(&probe) && !mouse_wheel_event(&probe);
+  if (move_) {
+    // The session owns the pointer until the release; the Glob may go at any time.
+    if (leftUp) {
+      std::unique_ptr<GlobMoveSession> s = std::move(move_);
+      e.pos = pos;
+      s->finish(pos, &e);
+    } else if (move && move_->target()) {
+      move_->track(pos, &e);
+    }
+    if (move_ && !move_->target()) move_.reset();
+    return true;
+  }
+  if (drag_) {
+    if (leftUp) {
+      std::unique_ptr<GlobDragSession> s = std::move(drag_);
+      s->finish(pos);
+    } else if (move) {
+      drag_->track(pos);
+    }
+    return true;
+  }
+  return move && (buttonsDown_ & 0x20) && maybeStartDrag(pos);
+}
+
+bool RootGlob::maybeStartDrag(XY<int> pos) {
+  Glob* source = grab_.get();
+  if (dragAsked_ || !source || source == this) return false;
+  // A drag starts when the pointer leaves the Glob it was pressed on.
+  if (source->canvas()->visibleRootRect().contains(pos)) return false;
+  dragAsked_ = true;
+  DragPayload payload;
+  GlobHandle<> at(source);
+  while (Glob* g = at.get()) {
+    if (g == this) return false;
+    GlobHandle<> up(g->parent());
+    if (g->dragPayload(pressPos_ - g->canvas()->rootOrigin(), payload) && at.alive() &&
+        !payload.empty()) {
+      drag_ = std::make_unique<GlobDragSession>(*this, at.get(), payload);
+      drag_->track(pos);
+      return true;
+    }
+    at = up;
+  }
+  return false;
+}
+
+bool RootGlob::beginUserMove(Glob* g, XY<int> pos) {
+  if (!is_good_glob_ptr(g) || g == this || g->root() != this || move_ || drag_) return false;
+  const GlobResizeEdge edge = g->resizeEdgeAt(pos);
+  if (edge == GlobResizeEdge::None) {
+    if (!g->get_movable() || !g->isMoveHandleAt(pos)) return false;
+    GlobHandle<> h(g);
+    if (!g->pick() || !h.alive()) return false;
+  }
+  move_ = std::make_unique<GlobMoveSession>(g, edge, pos + g->canvas()->rootOrigin());
+  return true;
+}
+
+Glob* RootGlob::userMoveTarget() const {
+  return move_ ? move_->target() : nullptr;
+}
+
+Glob* RootGlob::dragSource() const {
+  return drag_ ? drag_->source() : nullptr;
+}
+
+Glob* RootGlob::dropTarget() const {
+  return drag_ ? drag_->target() : nullptr;
+}
+
+namespace {
+
+Canvas* hitExcept(Canvas* c, XY<int> p, const Canvas* skip) {
+  if (c == skip || !c->isMapped() || !c->localBounds().contains(p)) return nullptr;
+  const auto& kids = c->children();
+  for (auto it = kids.rbegin(); it != kids.rend(); ++it) {
+    const Kw::Box<int>& r = (*it)->rect();
+    if (Canvas* h = hitExcept(*it, p - XY<int>(r.x0, r.y0), skip)) return h;
+  }
+  return c;
+}
+
+}  // namespace
+
+Glob* RootGlob::globAtExcept(XY<int> pos, const Glob* skip) const {
+  const Canvas* skipCanvas = skip ? skip->canvas() : nullptr;
+  for (Canvas* c = hitExcept(canvas(), pos, skipCanvas); c; c = c->parent()) {
+    if (Glob* g = globOf(c)) return g;
+  }
+  return nullptr;
+}
+
+void RootGlob::setIt(Glob* g) {
+  if (g && (g->root() != this || !g->can_be_it())) return;
+  if (it_.refersTo(g) && it_.alive()) return;
+  Glob* old = it_.get();
+  it_ = GlobHandle<>(g);
+  if (old) old->handle_it();
+  if (g && it_.refersTo(g) && it_.alive()) g->handle_it();
+}
+
+void RootGlob::deleteLater(Glob* g) {
+  if (!is_good_glob_ptr(g) || g == this) return;
+  doomed_.emplace_back(g);
 }
 
 // --- Placing Globs on the screen ---
@@ -208,6 +326,12 @@ size_t RootGlob::pumpQueue(size_t limit) {
     event_send(&e, false);
   }
   if (!queue_.empty()) diagWarning("pumpQueue: delivery limit reached, the rest waits\n");
+  // Globs that asked to go, now that nothing is handling them. A destructor may ask for more.
+  while (!doomed_.empty()) {
+    GlobHandle<> h = doomed_.back();
+    doomed_.pop_back();
+    delete h.get();
+  }
   return n;
 }
 

@@ -4,6 +4,7 @@
 // clock, collects damage and runs repaint passes. Back ends and the test harness feed it.
 #include <deque>
 #include <functional>
+#include <memory>
 #include <vector>
 
 #include "platform/glob/CanvasHost.h"
@@ -12,6 +13,8 @@
 #include "platform/glob/GlobHandle.h"
 #include "platform/glob/PaintSession.h"
 
+class GlobDragSession;
+class GlobMoveSession;
 class RootPaintSession;
 
 class RootGlob : public Glob, public CanvasHost {
@@ -78,6 +81,30 @@ class RootGlob : public Glob, public CanvasHost {
   // The deepest Glob at a root position.
   Glob* globAt(XY<int> pos) const;
 
+  // --- User moves, resizes and drags ---
+  // Starts a user move or resize of `g` for a left press at `pos` (g's coordinates): a resize
+  // on a resize handle of a resizeable Glob, otherwise a move of a movable Glob pressed on
+  // its move handle whose pick() agrees. The pointer then belongs to the session until the
+  // release. False, with nothing started, otherwise.
+  bool beginUserMove(Glob* g, XY<int> pos);
+  // The Glob being moved or resized by the user, or null.
+  Glob* userMoveTarget() const;
+  // The source of the drag and drop going on, and the target that would take it, or null.
+  Glob* dragSource() const;
+  Glob* dropTarget() const;
+  // The deepest Glob at a root position with `skip` and everything inside it left out.
+  Glob* globAtExcept(XY<int> pos, const Glob* skip) const;
+
+  // --- "It": the Glob the user last picked up ---
+  Glob* it() const { return it_.get(); }
+  // Makes `g` "it" (null for none); the old and the new one get handle_it. Refused for a Glob
+  // of another screen or one that cannot be it.
+  void setIt(Glob* g);
+
+  // --- Deferred deletion ---
+  // Deletes `g` once the events being handled are over (at the end of the next pumpQueue).
+  void deleteLater(Glob* g);
+
   // --- Painting ---
   bool needsPaint() const { return !dirty_.empty(); }
   const DirtyRegion& dirty() const { return dirty_; }
@@ -103,6 +130,9 @@ class RootGlob : public Glob, public CanvasHost {
 
  private:
   void updateHover(Glob* under);
+  // Gives a pointer event to the move or drag going on, or starts a drag; true when taken.
+  bool routeToSessions(const Event& probe, XY<int> pos, Event& e);
+  bool maybeStartDrag(XY<int> pos);
   int dragTypeFor(int moveType) const;
   void paintTree(PaintSession& s, Canvas* c, const Kw::Box<int>& parentVisible,
                  const std::vector<Kw::Box<int>>& areas);
@@ -124,4 +154,9 @@ class RootGlob : public Glob, public CanvasHost {
   std::function<void(Glob*)> drawObserver_;
   std::vector<GlobHandle<>> inputScopes_;  // oldest first
   std::vector<GlobHandle<>> screenSized_;
+  std::unique_ptr<GlobMoveSession> move_;
+  std::unique_ptr<GlobDragSession> drag_;
+  bool dragAsked_ = false;  // whether this press's Glob was asked for a drag payload
+  GlobHandle<> it_;
+  std::vector<GlobHandle<>> doomed_;
 };

@@ -4,10 +4,12 @@
 #include <functional>
 
 #include "buttons/Button.h"
+#include "buttons/Checkbox.h"
 #include "foundation/TabOrderManager.h"
 #include "platform/glob/GlobHandle.h"
 #include "platform/glob/KeyCodes.h"
 #include "platform/misc/Diagnostics.h"
+#include "platform/misc/configb.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
 
@@ -486,4 +488,20 @@ TEST_F(ButtonTest, ButtonDeletedByItsOwnReportIsNotTouched) {
     EXPECT_FALSE(handle.alive());
     parent.action = nullptr;
   }
+}
+
+TEST(ButtonFramework, PathIsTheFaceAndBoxesStayOutOfSavedLayouts) {
+  Harness h(200, 100);
+  auto* b = new Button(L"Go", "go", h.place(10, 10, 60, 24));
+  Kw::Ptr<iRegion> outline = b->path();
+  ASSERT_TRUE(outline);
+  EXPECT_EQ(outline->bounds(), b->facepath());
+  EXPECT_TRUE(b->isOpaqueAt(XY<int>(5, 5)));
+  auto* box = new Checkbox(80, 20, false, 0, h.canvas());
+  EXPECT_EQ(box->get_dumpable(), 0);
+  configb saved;
+  box->dump(saved);
+  EXPECT_EQ(saved.size(), 0u);
+  b->dump(saved);
+  EXPECT_EQ(saved.get("button.width"), "60");
 }

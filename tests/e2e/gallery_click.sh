@@ -74,6 +74,9 @@ if ! xdotool getmouselocation >/dev/null 2>&1; then
   exit $SKIP
 fi
 
+# The gallery keeps its panel layout beside the preferences: a folder of this run's own.
+export XDG_CONFIG_HOME="$work/config"
+
 # --- The gallery in a window ---
 # Xvfb has no GPU: SDL draws in software instead of through Mesa's GL emulation, whose driver
 # is unloaded at exit and so hides its own allocations from the leak checker's suppressions.
@@ -136,6 +139,25 @@ wait_for "Ctrl+C" logged '"key 0x22000043 Ctrl+C"'
 wait_for "Left" logged '"key 0x0800004B Left"'
 wait_for "a typed character" logged '"key 0x00000071 q"'
 
+# 4. The floating panel, dragged for real by its title strip (left of its pin button).
+panel_at() {
+  grep -hF '"kind": "standard_panel", "name": "Drag and drop"' "$1" | head -n1 |
+    sed -E 's/.*"rect": \[([0-9-]+), ([0-9-]+), .*/\1 \2/'
+}
+read -r px py <<<"$(panel_at "$work/tree.json")"
+[ -n "${py:-}" ] || fail "no drag and drop panel in the tree"
+sx=$((px + 60))
+sy=$((py + 14))
+xdotool mousemove --window "$window" $sx $sy
+sleep 0.1
+xdotool mousedown 1
+for step in 1 2 3 4 5; do
+  xdotool mousemove --window "$window" $((sx - step * 40)) $((sy - step * 30))
+  sleep 0.05
+done
+xdotool mouseup 1
+sleep 0.2
+
 # --- Quit as a window manager would ask; the gallery must exit cleanly ---
 kill -TERM "$gallery_pid"
 deadline=$((SECONDS + TIMEOUT_S))
@@ -147,6 +169,14 @@ wait "$gallery_pid"
 status=$?
 gallery_pid=""
 [ $status -eq 0 ] || fail "the gallery exited with status $status"
+
+# 5. The panel's new place was saved on the way out and is where a new start puts it.
+[ -s "$work/config/globkit/gallery-layout" ] || fail "no saved layout"
+"$gallery" --headless --size 1100x760 --dump-tree >"$work/again.json" 2>"$work/gallery.err" ||
+  fail "no tree from the restart"
+read -r qx qy <<<"$(panel_at "$work/again.json")"
+[ "$qx $qy" = "$((px - 200)) $((py - 150))" ] ||
+  fail "the panel was at $px $py, dragged by -200 -150, and came back at $qx $qy"
 
 echo "PASS: $(wc -l <"$work/log") messages logged"
 exit 0
