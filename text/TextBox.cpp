@@ -385,10 +385,12 @@ int TextBox::caretY() const {
 }
 
 int TextBox::textXToDisplayX(int64_t x) const {
+  updateVisibleWindow();
   return clampToInt(textX_ + x - scrollOffset_);
 }
 
 int64_t TextBox::displayXToTextX(int x) const {
+  updateVisibleWindow();
   return int64_t{x} - textX_ + scrollOffset_;
 }
 
@@ -405,7 +407,7 @@ void TextBox::relayout() {
     ruler_.setText(model_.text());
   }
   rulerRevision_ = model_.revision();
-  updateVisibleWindow();
+  windowStale_ = true;
   placeCaret();
 }
 
@@ -414,7 +416,9 @@ void TextBox::changed() {
   invalidateTextSelection();
 }
 
-void TextBox::updateVisibleWindow() {
+void TextBox::updateVisibleWindow() const {
+  if (!windowStale_) return;
+  windowStale_ = false;
   const int stretch = stretchWidth();
   const int64_t textWidth = ruler_.width();
   if (textWidth <= stretch) {

@@ -111,8 +111,14 @@ class TextBox : public TextBoxBase {
   // Hidden text never goes to the clipboard.
   bool canCopyText() const override { return !obfuscated_ && !isEmpty(); }
   // Where the text starts (alignment), and how far it is scrolled left, in pixels.
-  int textX() const { return textX_; }
-  int scrollOffset() const { return scrollOffset_; }
+  int textX() const {
+    updateVisibleWindow();
+    return textX_;
+  }
+  int scrollOffset() const {
+    updateVisibleWindow();
+    return scrollOffset_;
+  }
   // The caret's x in the box (text x plus caret x less the scroll offset).
   int caretDisplayX() const;
   const TextRuler& ruler() const { return ruler_; }
@@ -147,7 +153,9 @@ class TextBox : public TextBoxBase {
   bool eraseSelectedText(bool undoable);
   WString getText(CharPos from, CharPos to) const override;
   void updateCurrentPosition(Glib::iFont::eCharSeekMethod method, int index) override;
-  void updateVisibleWindow();
+  // Places the text in the box (textX_, scrollOffset_) when something changed since the last
+  // time; asked by every reader, so that a box nobody looks at measures nothing.
+  void updateVisibleWindow() const;
   void placeCaret();
   void drawText(Glib::Painter& p);
   int textXToDisplayX(int64_t x) const;
@@ -185,8 +193,10 @@ class TextBox : public TextBoxBase {
 
   TextRuler ruler_;
   std::uint64_t rulerRevision_ = ~std::uint64_t{0};
-  int scrollOffset_ = 0;
-  int textX_ = kDefaultMargin;
+  // Where the text sits: worked out from the text, caret and margins when first needed.
+  mutable int scrollOffset_ = 0;
+  mutable int textX_ = kDefaultMargin;
+  mutable bool windowStale_ = false;
   unsigned char leftMargin_ = kDefaultMargin;
   unsigned char rightMargin_ = kDefaultMargin;
   TextAlignment alignment_ = TextAlignment::Left;

@@ -32,15 +32,26 @@ void TextRuler::setFont(const Glib::FontPtr& font) {
 }
 
 void TextRuler::remeasureAll() {
-  int64_t x = 0;
-  for (Piece& p : pieces_) {
-    p.x = x;
-    p.width = measure(text_, p.start, p.length);
-    x += p.width;
-  }
+  for (Piece& p : pieces_) p.width = kUnmeasured;
+  unsettledFrom_ = 0;
+  settled_ = pieces_.empty();
 }
 
-int TextRuler::measure(const WString& text, int start, int length) {
+void TextRuler::settle() const {
+  if (settled_) return;
+  std::size_t i = std::min(unsettledFrom_, pieces_.size());
+  int64_t x = i > 0 ? pieces_[i - 1].x + pieces_[i - 1].width : 0;
+  for (; i < pieces_.size(); ++i) {
+    Piece& p = pieces_[i];
+    if (p.width == kUnmeasured) p.width = measure(text_, p.start, p.length);
+    p.x = x;
+    x += p.width;
+  }
+  unsettledFrom_ = pieces_.size();
+  settled_ = true;
+}
+
+int TextRuler::measure(const WString& text, int start, int length) const {
   ++measured_;
   if (!font_ || length <= 0) return 0;
   return font_->textWidth(
@@ -63,6 +74,7 @@ void TextRuler::setText(const WString& text) {
     mask_ = 0;
     text_.clear();
     pieces_.clear();
+    settled_ = true;
     length_ = 0;
   }
   const int oldLen = static_cast<int>(text_.size());
@@ -82,7 +94,6 @@ void TextRuler::setText(const WString& text) {
   const std::size_t first = prefix == 0 ? 0 : pieceAt(prefix - 1);
   const int delta = newLen - oldLen;
   int pos = first < pieces_.size() ? pieces_[first].start : 0;
-  int64_t x = first > 0 ? pieces_[first - 1].x + pieces_[first - 1].width : 0;
   std::vector<Piece> fresh;
   std::size_t keepFrom = pieces_.size();
   std::size_t old = first;
@@ -97,24 +108,21 @@ void TextRuler::setText(const WString& text) {
       }
     }
     const int end = pieceEnd(text_, pos);
-    Piece p{pos, end - pos, x, measure(text_, pos, end - pos)};
-    fresh.push_back(p);
-    x += p.width;
+    fresh.push_back(Piece{pos, end - pos, 0, kUnmeasured});
     pos = end;
   }
   const auto at = pieces_.begin() + static_cast<std::ptrdiff_t>(first);
   pieces_.erase(at, pieces_.begin() + static_cast<std::ptrdiff_t>(keepFrom));
   pieces_.insert(pieces_.begin() + static_cast<std::ptrdiff_t>(first), fresh.begin(), fresh.end());
-  for (std::size_t i = first + fresh.size(); i < pieces_.size(); ++i) {
-    pieces_[i].start += delta;
-    pieces_[i].x = x;
-    x += pieces_[i].width;
-  }
+  for (std::size_t i = first + fresh.size(); i < pieces_.size(); ++i) pieces_[i].start += delta;
+  unsettledFrom_ = settled_ ? first : std::min(unsettledFrom_, first);
+  settled_ = false;
 }
 
 void TextRuler::setMasked(wchar_t mask, int length) {
   text_.clear();
   pieces_.clear();
+  settled_ = true;
   if (mask != mask_) maskWidth_ = -1;
   mask_ = mask;
   length_ = mask == 0 ? 0 : std::max(length, 0);
@@ -130,6 +138,7 @@ int TextRuler::maskWidth() const {
 int64_t TextRuler::width() const {
   if (mask_ != 0) return xOf(length_);
   if (pieces_.empty()) return 0;
+  settle();
   return pieces_.back().x + pieces_.back().width;
 }
 
@@ -156,6 +165,7 @@ int64_t TextRuler::xOf(int index) const {
     return base + font_->charSeek(WString(kMaxPiece, mask_), 0, Glib::iFont::ToIndex, within).x;
   }
   if (pieces_.empty()) return 0;
+  settle();
   const Piece& p = pieces_[pieceAt(index)];
   const int within = index - p.start;
   if (within <= 0) return p.x;
@@ -176,6 +186,7 @@ int TextRuler::indexAt(int64_t x) const {
         font_->locate(WString(kMaxPiece, mask_), static_cast<int>(x - chunk * w)).index);
     return std::min(length_, static_cast<int>(chunk * kMaxPiece) + in);
   }
+  settle();
   const Piece& p = pieces_[pieceAtX(x)];
   const int64_t local = std::min<int64_t>(x - p.x, p.width);
   const WString piece =
@@ -197,6 +208,7 @@ void TextRuler::forEachPiece(int64_t x0, int64_t x1, const PieceVisitor& visit) 
     }
     return;
   }
+  settle();
   for (std::size_t i = pieceAtX(clampX(x0)); i < pieces_.size() && pieces_[i].x < x1; ++i) {
     const Piece& p = pieces_[i];
     if (p.x + p.width <= x0) continue;

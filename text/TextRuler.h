@@ -14,6 +14,9 @@
 // between the last letter of one piece and the first of the next), which on the space-led cuts
 // of ordinary text changes nothing.
 //
+// Measuring waits for the first question that needs a position: a box built with its text
+// and never shown shapes nothing, and several edits between two paints are measured once.
+//
 // A masked ruler (obfuscated display) shows every character as one mask character of a
 // monospace font: positions are multiples of its width, and no text is kept at all.
 #include <cstdint>
@@ -56,15 +59,18 @@ class TextRuler {
   std::uint64_t measuredPieces() const { return measured_; }
 
  private:
+  static constexpr int kUnmeasured = -1;
   struct Piece {
     int start = 0;
     int length = 0;
-    int64_t x = 0;  // from the line's start
-    int width = 0;
+    int64_t x = 0;  // from the line's start; valid once settled
+    int width = kUnmeasured;
   };
 
   int pieceEnd(const WString& text, int start) const;
-  int measure(const WString& text, int start, int length);
+  int measure(const WString& text, int start, int length) const;
+  // Measures the pieces that are not yet and places every piece from the first that moved.
+  void settle() const;
   // The piece holding the caret position `index`: the last piece starting at or before it.
   std::size_t pieceAt(int index) const;
   std::size_t pieceAtX(int64_t x) const;
@@ -73,9 +79,12 @@ class TextRuler {
 
   Glib::FontPtr font_;
   WString text_;
-  std::vector<Piece> pieces_;
+  // Widths and places are filled in by the const queries (settle), hence mutable.
+  mutable std::vector<Piece> pieces_;
+  mutable std::size_t unsettledFrom_ = 0;  // pieces from here on need placing
+  mutable bool settled_ = true;
   int length_ = 0;
   wchar_t mask_ = 0;
   mutable int maskWidth_ = -1;
-  std::uint64_t measured_ = 0;
+  mutable std::uint64_t measured_ = 0;
 };

@@ -12,7 +12,7 @@ namespace Glib {
 
 class LayoutCache {
  public:
-  static constexpr size_t kDefaultCapacity = 4096;
+  static constexpr size_t kDefaultCapacity = 1024;  // a full screen of labels, twice over
   static constexpr size_t kMaxCachedChars = 1024;
 
   explicit LayoutCache(size_t capacity = kDefaultCapacity) : capacity_(capacity) {}

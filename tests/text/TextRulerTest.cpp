@@ -93,12 +93,39 @@ TEST(TextRuler, TypingInALongTextMeasuresOnlyNearbyPieces) {
   TextRuler r = rulerFor(text);
   const std::size_t pieces = r.pieceCount();
   EXPECT_GT(pieces, 10000u / TextRuler::kMaxPiece);
+  EXPECT_GT(r.width(), 0);
   for (std::size_t at : {text.size(), std::size_t{5003}, std::size_t{0}}) {
     const auto before = r.measuredPieces();
     text.insert(at, L"q");
     r.setText(text);
+    EXPECT_GT(r.width(), 0);
     EXPECT_LE(r.measuredPieces() - before, 2u) << at;
   }
+}
+
+// Nothing is shaped until a position is asked for; edits in between are measured once, and
+// the answer is the one an eager ruler gives.
+TEST(TextRuler, MeasuresOnlyWhenAPositionIsAsked) {
+  WString text = prose(1000);
+  TextRuler r = rulerFor(text);
+  EXPECT_EQ(r.measuredPieces(), 0u);
+  const std::size_t pieces = r.pieceCount();
+  EXPECT_GT(r.xOf(500), 0);
+  EXPECT_EQ(r.measuredPieces(), pieces);
+
+  for (int k = 0; k < 5; ++k) {
+    text.insert(600, L"word ");
+    r.setText(text);
+  }
+  EXPECT_EQ(r.measuredPieces(), pieces);
+  expectSameAsFresh(r, text);
+  EXPECT_LT(r.measuredPieces() - pieces, r.pieceCount() / 2);
+
+  r.setFont(Glib::FontPtr(Glib::fonts().get(Glib::FontDesc("DejaVu Sans Mono", 14))));
+  const auto beforeFont = r.measuredPieces();
+  EXPECT_EQ(r.measuredPieces(), beforeFont);
+  EXPECT_GT(r.width(), 0);
+  EXPECT_EQ(r.measuredPieces() - beforeFont, r.pieceCount());
 }
 
 TEST(TextRuler, MaskedTextIsUniformAndDrawsOnlyTheVisiblePieces) {
