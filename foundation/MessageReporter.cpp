@@ -19,6 +19,10 @@ Glob* MessageReporter::target(Glob& self) {
 bool MessageReporter::report(Glob& self, const String& msg) const {
   Glob* to = target(self);
   if (!to) return false;
-  send_message_event(&self, to, msg.empty() ? message_ : msg, modifiers_);
+  // The event names the reporting control's canvas, not the receiver's: receivers that look
+  // at where a report came from find the control there.
+  Event e = make_message_event(&self, to, msg.empty() ? message_ : msg, modifiers_);
+  e.canvas = self.canvas();
+  event_send(&e, false);
   return true;
 }

@@ -6,9 +6,11 @@
 
 RootRenderer::RootRenderer(RootGlob& root) : root_(root) {
   makeSurface(root.canvas()->width(), root.canvas()->height());
+  root_.setUnbufferedPainter([this](const Kw::Box<int>& area) { return renderNow(area); });
 }
 
 RootRenderer::~RootRenderer() {
+  root_.setUnbufferedPainter(nullptr);
   session_.reset();
   cairo_surface_destroy(surface_);
 }
@@ -26,8 +28,25 @@ void RootRenderer::makeSurface(int width, int height) {
 bool RootRenderer::render() {
   const Canvas* c = root_.canvas();
   if (c->width() != width() || c->height() != height()) makeSurface(c->width(), c->height());
-  if (!root_.paint(*session_)) return false;
-  for (const auto& a : session_->presentedAreas()) changed_ = changed_.united(a);
+  const bool painted = root_.paint(*session_);
+  if (!painted && unbufferedSinceRender_.empty()) return false;
+  presented_ = std::move(unbufferedSinceRender_);
+  unbufferedSinceRender_.clear();
+  if (painted) {
+    const auto& frame = session_->presentedAreas();
+    presented_.insert(presented_.end(), frame.begin(), frame.end());
+  }
+  for (const auto& a : presented_) changed_ = changed_.united(a);
+  return true;
+}
+
+bool RootRenderer::renderNow(const Kw::Box<int>& rootArea) {
+  // A screen that changed size since the last render has no image of its size yet.
+  const Canvas* c = root_.canvas();
+  if (c->width() != width() || c->height() != height()) return false;
+  if (!root_.paintAreas(*session_, {rootArea})) return false;
+  const auto& frame = session_->presentedAreas();
+  unbufferedSinceRender_.insert(unbufferedSinceRender_.end(), frame.begin(), frame.end());
   return true;
 }
 

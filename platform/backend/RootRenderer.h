@@ -28,7 +28,8 @@ class RootRenderer {
 
   // Areas repainted by the last render that painted, top-down, in pixels of the image (what
   // a window needs to present).
-  const std::vector<Kw::Box<int>>& presentedAreas() const { return session_->presentedAreas(); }
+  // Areas painted at once (drawUnbuffered) since the render before are added.
+  const std::vector<Kw::Box<int>>& presentedAreas() const { return presented_; }
   // Every frame painted since the last call to takeChanged(), merged; top-down.
   Kw::Box<int> takeChanged();
 
@@ -45,9 +46,13 @@ class RootRenderer {
 
  private:
   void makeSurface(int width, int height);
+  // Paints a root area at once, outside the frames; false when the image cannot be used now.
+  bool renderNow(const Kw::Box<int>& rootArea);
 
   RootGlob& root_;
   cairo_surface_t* surface_ = nullptr;
   std::unique_ptr<Glib::CairoPaintSession> session_;
   Kw::Box<int> changed_;
+  std::vector<Kw::Box<int>> presented_;
+  std::vector<Kw::Box<int>> unbufferedSinceRender_;
 };

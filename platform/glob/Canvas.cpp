@@ -90,10 +90,15 @@ Kw::Box<int> Canvas::visibleRootRect() const {
 void Canvas::reshape(const Kw::Box<int>& rectInParent) {
   if (rectInParent == rect_) return;
   damage();
+  reshapeQuietly(rectInParent);
+  damage();
+}
+
+void Canvas::reshapeQuietly(const Kw::Box<int>& rectInParent) {
+  if (rectInParent == rect_) return;
   rect_ = rectInParent;
   if (parent_) parent_->childrenChanged();
   childrenChanged();
-  damage();
 }
 
 void Canvas::translate(int dx, int dy) {

@@ -37,6 +37,9 @@ class Canvas {
   Kw::Box<int> visibleRootRect() const;
   void reshape(const Kw::Box<int>& rectInParent);
   void translate(int dx, int dy);
+  // Takes the new rectangle without reporting damage: for an owner that repaints the old and
+  // new places itself, later (a frozen Glob).
+  void reshapeQuietly(const Kw::Box<int>& rectInParent);
 
   // Mapping. A canvas shows only when it and all its ancestors are mapped up to a root.
   void map();

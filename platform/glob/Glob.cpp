@@ -135,9 +135,9 @@ void Glob::reshape_canvas(int x, int y, int width, int height) {
     ex.oldHeight = this->height();
     ex.hasOldSize = true;
   }
-  canvas_.reshape(Kw::Box<int>::fromSize(x, y, std::max(0, width), std::max(0, height)));
+  placeCanvas(Kw::Box<int>::fromSize(x, y, std::max(0, width), std::max(0, height)));
   if (!resized) return;
-  if (frozenHolder()) {
+  if (frozenHolder() || layoutHeld_) {
     layoutOwed_ = true;
     return;
   }
@@ -145,7 +145,7 @@ void Glob::reshape_canvas(int x, int y, int width, int height) {
 }
 
 void Glob::translate_canvas(int dx, int dy) {
-  canvas_.translate(dx, dy);
+  placeCanvas(canvas_.rect().translated(dx, dy));
 }
 
 void Glob::set_kbd_focus() {

@@ -146,7 +146,9 @@ class Glob : public Notifiable, public CanvasClient, public Drawable, public Gli
   // Dumped only when dumped itself, not as part of its parent's dump.
   virtual void set_dump_ifnot_subglob(int only);
   virtual int get_dump_ifnot_subglob() const { return dumpIfNotSubglob_; }
-  // Quick drawing: a hint that the Glob may draw a simpler face while it is being moved.
+  // Quick drawing: a user resize of the Glob repaints it at every step but lays it out
+  // (reshape) only once, at the release, for Globs whose layout is too dear to follow the
+  // pointer. Resizes by code are laid out at once as always.
   virtual void set_quickdraw(int quick);
   virtual int get_quickdraw() const { return quickdraw_; }
   // Dirty: the Glob holds changes not yet saved. Marking it dirty repaints it.
@@ -221,7 +223,9 @@ class Glob : public Notifiable, public CanvasClient, public Drawable, public Gli
   virtual bool receiveDrop(const DragPayload& payload, const XY<int>& pos) { return false; }
 
   // --- CanvasClient ---
-  EventHandlerRc handleEvent(Event* e) override { return react(e); }
+  // Hands `e` to this Glob now, outside the tree's routing and without bubbling: the event
+  // is addressed to this Glob and its react result returned (not consumed for a null event).
+  EventHandlerRc handleEvent(Event* e) override;
   void resize(double width, double height) override;
   void handleBaseWindowMove() override;
   const char* idstring() const override { return "glob"; }
@@ -229,6 +233,9 @@ class Glob : public Notifiable, public CanvasClient, public Drawable, public Gli
   String contextString(const XY<int>& pos, CanvasClient* asker) override;
   MouseCursorID contextCursor(const XY<int>& pos) override;
   void handleMouseContainment(bool inside) override {}
+  // Paints the bounding box of `area` (own coordinates; null for the whole Glob) into the
+  // screen's image at once, with whatever lies above it. Without an image, while frozen or
+  // while redraws are held back, the area is repainted with the next frame instead.
   void drawUnbuffered(Kw::Ptr<iRegion> area) override;
   bool isOpaqueAt(const XY<int>& pos) override;
 
@@ -294,6 +301,9 @@ class Glob : public Notifiable, public CanvasClient, public Drawable, public Gli
   static Glob* globOf(const Canvas* c);
 
  private:
+  // Holds back and then pays the layout of a quickdraw Glob during a user resize.
+  friend class GlobMoveSession;
+
   // What few Globs set: made on the first setting that differs from the default.
   struct Extras {
     String name;
@@ -303,11 +313,16 @@ class Glob : public Notifiable, public CanvasClient, public Drawable, public Gli
     unsigned short oldWidth = 0, oldHeight = 0;
     bool hasOldSize = false;
     XY<int> minSize{8, 8};
+    // Root area whose repaint a frozen Glob owes for moves and resizes inside it.
+    Kw::Box<int> owedArea;
   };
   Extras& extras();
   // The frozen Glob that holds this one's repaints and layouts back (itself or an ancestor),
   // or null.
   Glob* frozenHolder() const;
+  // Gives the canvas a new rectangle in its parent; while frozen, the old and new places are
+  // owed to the frozen holder instead of repainted now.
+  void placeCanvas(const Kw::Box<int>& rectInParent);
   // Whether a child takes part in its parent's dump and load.
   bool joinsParentLayout() const { return dumpable_ && !dumpIfNotSubglob_; }
 
@@ -332,6 +347,7 @@ class Glob : public Notifiable, public CanvasClient, public Drawable, public Gli
   bool redrawOwed_ : 1 = false;  // an update arrived while frozen
   bool layoutOwed_ : 1 = false;  // a change of size arrived while frozen
   bool dropHover_ : 1 = false;
+  bool layoutHeld_ : 1 = false;    // a user resize of a quickdraw Glob is going on
   uint8_t cursor_ = kCursorArrow;  // a MouseCursorID; every one fits a byte
 };
 

@@ -2,6 +2,7 @@
 // layouts asked of it or of any Glob inside it are only noted; the last unfreeze pays them once.
 #include "platform/glob/Glob.h"
 #include "platform/glob/GlobHandle.h"
+#include "platform/glob/RootGlob.h"
 #include "platform/misc/Diagnostics.h"
 
 namespace {
@@ -18,6 +19,20 @@ Glob* Glob::frozenHolder() const {
     if (g->isFrozen()) return const_cast<Glob*>(g);
   }
   return nullptr;
+}
+
+void Glob::placeCanvas(const Kw::Box<int>& rectInParent) {
+  Glob* holder = frozenHolder();
+  if (!holder) {
+    canvas_.reshape(rectInParent);
+    return;
+  }
+  if (rectInParent == canvas_.rect()) return;
+  Extras& ex = holder->extras();
+  ex.owedArea = ex.owedArea.united(canvas_.visibleRootRect());
+  canvas_.reshapeQuietly(rectInParent);
+  ex.owedArea = ex.owedArea.united(canvas_.visibleRootRect());
+  holder->redrawOwed_ = true;
 }
 
 void Glob::freeze() {
@@ -37,10 +52,15 @@ void Glob::unfreeze() {
   // delete Globs of the subtree: walk_subtree skips those.
   GlobHandle<> self(this);
   bool repaint = redrawOwed_;
-  walk_subtree([&repaint](Glob* g) {
+  Kw::Box<int> owed;
+  walk_subtree([&repaint, &owed](Glob* g) {
     repaint = repaint || g->redrawOwed_ || g->layoutOwed_;
     g->redrawOwed_ = false;
-    if (g->layoutOwed_ && !g->frozenHolder()) {
+    if (g->extras_ && !g->extras_->owedArea.empty()) {
+      owed = owed.united(g->extras_->owedArea);
+      g->extras_->owedArea = Kw::Box<int>();
+    }
+    if (g->layoutOwed_ && !g->layoutHeld_ && !g->frozenHolder()) {
       g->layoutOwed_ = false;
       g->reshape();
     }
@@ -49,6 +69,8 @@ void Glob::unfreeze() {
   if (self && repaint) {
     redrawOwed_ = false;
     canvas_.damage();
+    // Places left by moves while frozen; the area is in the screen's coordinates.
+    if (RootGlob* r = root(); r && !owed.empty()) r->canvasDamaged(owed);
   }
 }
 

@@ -6,7 +6,23 @@
 
 GlobMoveSession::GlobMoveSession(Glob* target, GlobResizeEdge edge, XY<int> pressRoot)
     : target_(target), edge_(edge), pressRoot_(pressRoot) {
-  if (target) start_ = target->canvas()->rect();
+  if (!target) return;
+  start_ = target->canvas()->rect();
+  if (edge_ != GlobResizeEdge::None && target->get_quickdraw()) target->layoutHeld_ = true;
+}
+
+GlobMoveSession::~GlobMoveSession() {
+  releaseLayout();
+}
+
+void GlobMoveSession::releaseLayout() {
+  Glob* g = target_.get();
+  if (!g || !g->layoutHeld_) return;
+  g->layoutHeld_ = false;
+  if (!g->layoutOwed_) return;
+  g->layoutOwed_ = false;
+  // A freeze around the resize still holds the layout back until its thaw.
+  g->reshape_myself();
 }
 
 void GlobMoveSession::track(XY<int> pointerRoot, Event* e) {
@@ -20,6 +36,7 @@ void GlobMoveSession::track(XY<int> pointerRoot, Event* e) {
 
 void GlobMoveSession::finish(XY<int> pointerRoot, Event* e) {
   track(pointerRoot, e);
+  releaseLayout();
   Glob* g = target_.get();
   if (!g || edge_ != GlobResizeEdge::None) return;
   if (moved_ && g->get_reparent()) reparentAt(pointerRoot);

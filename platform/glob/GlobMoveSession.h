@@ -6,13 +6,16 @@
 //   pointer       move                                  resize
 //   moves         realPositionConstrain, then moved()   the edge follows, down to minimumSize,
 //                                                       not beyond the screen
-//   release       re-parent (set_reparent), drop()      nothing more
+//   release       re-parent (set_reparent), drop()      a quickdraw Glob is laid out
 #include "platform/glob/Glob.h"
 #include "platform/glob/GlobHandle.h"
 
 class GlobMoveSession {
  public:
   GlobMoveSession(Glob* target, GlobResizeEdge edge, XY<int> pressRoot);
+  ~GlobMoveSession();
+  GlobMoveSession(const GlobMoveSession&) = delete;
+  GlobMoveSession& operator=(const GlobMoveSession&) = delete;
 
   Glob* target() const { return target_.get(); }
   GlobResizeEdge edge() const { return edge_; }
@@ -25,6 +28,8 @@ class GlobMoveSession {
   void moveTo(XY<int> pointerRoot, Event* e);
   void resizeTo(XY<int> pointerRoot);
   void reparentAt(XY<int> pointerRoot);
+  // Ends the holding back of a quickdraw Glob's layout and lays it out if a resize asked.
+  void releaseLayout();
 
   GlobHandle<> target_;
   GlobResizeEdge edge_;

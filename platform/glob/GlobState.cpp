@@ -46,12 +46,23 @@ bool Glob::isOpaqueAt(const XY<int>& pos) {
 }
 
 void Glob::drawUnbuffered(Kw::Ptr<iRegion> area) {
-  // Painting happens in frames; the nearest thing to "at once" is the very next one.
-  if (area) {
-    update(area->bounds());
-  } else {
-    update();
-  }
+  const Kw::Box<int> local =
+      area ? area->bounds().intersection(canvas_.localBounds()) : canvas_.localBounds();
+  if (local.empty()) return;
+  RootGlob* r = root();
+  const XY<int> o = canvas_.rootOrigin();
+  const Kw::Box<int> onScreen = local.translated(o.x, o.y).intersection(canvas_.visibleRootRect());
+  if (onScreen.empty()) return;
+  // The whole tree is painted in the area, so what lies above this Glob stays on top.
+  if (r && !frozenHolder() && r->paintNow(onScreen)) return;
+  update(local);
+}
+
+EventHandlerRc Glob::handleEvent(Event* e) {
+  if (!e) return kEventNotConsumed;
+  e->dest = this;
+  e->canvas = &canvas_;
+  return react(e);
 }
 
 void Glob::handleBaseWindowMove() {

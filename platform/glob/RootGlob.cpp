@@ -72,15 +72,27 @@ void RootGlob::injectMouse(int type, XY<int> pos, int wheelSteps) {
   e.screenPos = pos;
   e.word2 = static_cast<uint32_t>(wheelSteps);
   const int button = type & 0xF0;
-  Glob* target = nullptr;
+  const int buttonBits = button == 0x80 ? 0x60 : button;
+  // The buttons held are tracked even for events a filter keeps, so that later events read
+  // right; the grab only follows presses that are routed.
   if (mouse_down_event(&probe)) {
-    buttonsDown_ |= button == 0x80 ? 0x60 : button;
+    buttonsDown_ |= buttonBits;
     pressPos_ = pos;
     dragAsked_ = false;
+  } else if (mouse_up_event(&probe)) {
+    buttonsDown_ &= ~buttonBits;
+  }
+  e.pressPos = pressPos_;
+  if (offerToFilters(e)) {
+    if (buttonsDown_ == 0) grab_.reset();
+    return;
+  }
+  under = hovered_.get();  // a filter may have deleted it
+  Glob* target = nullptr;
+  if (mouse_down_event(&probe)) {
     target = grab_.get() ? grab_.get() : under;
     if (!grab_.get()) grab_ = GlobHandle<>(under);
   } else if (mouse_up_event(&probe)) {
-    buttonsDown_ &= ~(button == 0x80 ? 0x60 : button);
     target = grab_.get() ? grab_.get() : under;
     if (buttonsDown_ == 0) grab_.reset();
   } else if (mouse_wheel_event(&probe)) {
@@ -88,7 +100,6 @@ void RootGlob::injectMouse(int type, XY<int> pos, int wheelSteps) {
   } else {
     target = grab_.get() ? grab_.get() : under;
   }
-  e.pressPos = pressPos_;
   if (routeToSessions(probe, pos, e)) return;
   if (!target) return;
   const XY<int> o = target->canvas()->rootOrigin();
@@ -100,6 +111,7 @@ void RootGlob::injectKey(int type, unsigned keyCode) {
   Event e(type);
   e.word2 = keyCode;
   e.screenPos = pointer_;
+  if (offerToFilters(e)) return;
   deliver(e, keyTarget(), true);
 }
 
@@ -274,6 +286,50 @@ void RootGlob::reshape() {
   for (const auto& h : now) {
     if (Glob* g = h.get()) g->reshape_canvas(0, 0, width(), height());
   }
+}
+
+// --- Event filters ---
+
+bool RootGlob::addEventFilter(Glob* filter, void* context) {
+  if (!is_good_glob_ptr(filter)) return false;
+  for (auto& f : filters_) {
+    if (f.glob.refersTo(filter) && f.glob.alive()) {
+      f.context = context;
+      return true;
+    }
+  }
+  filters_.push_back({GlobHandle<>(filter), context});
+  return true;
+}
+
+void RootGlob::removeEventFilter(Glob* filter) {
+  std::erase_if(filters_, [filter](const EventFilter& f) {
+    return f.glob.refersTo(filter) || !f.glob.alive();
+  });
+}
+
+size_t RootGlob::eventFilterCount() const {
+  return static_cast<size_t>(std::count_if(filters_.begin(), filters_.end(),
+                                           [](const EventFilter& f) { return f.glob.alive(); }));
+}
+
+bool RootGlob::offerToFilters(Event& e) {
+  if (filters_.empty()) return false;
+  std::erase_if(filters_, [](const EventFilter& f) { return !f.glob.alive(); });
+  // A copy: a filter may add, remove or delete filters, itself included.
+  const std::vector<EventFilter> now = filters_;
+  for (auto it = now.rbegin(); it != now.rend(); ++it) {
+    Glob* g = it->glob.get();
+    if (!g) continue;
+    Event seen = e;
+    seen.dest = g;
+    seen.canvas = g->canvas();
+    if (mouse_event(&e)) {
+      seen.pos = g->root() == this ? e.screenPos - g->canvas()->rootOrigin() : e.screenPos;
+    }
+    if (g->fsFilterThis(&seen, it->context)) return true;
+  }
+  return false;
 }
 
 // --- Input scopes ---
@@ -454,8 +510,23 @@ void RootGlob::canvasRemoved(Canvas* c) {
 // --- Painting ---
 
 bool RootGlob::paint(PaintSession& session) {
-  if (!Drawable::redrawsEnabled() || dirty_.empty()) return false;
-  const std::vector<Kw::Box<int>> areas = dirty_.take();
+  if (!Drawable::redrawsEnabled() || dirty_.empty() || painting_) return false;
+  return paintAreas(session, dirty_.take());
+}
+
+bool RootGlob::paintNow(const Kw::Box<int>& rootArea) {
+  return unbufferedPainter_ && unbufferedPainter_(rootArea);
+}
+
+bool RootGlob::paintAreas(PaintSession& session, const std::vector<Kw::Box<int>>& given) {
+  // A draw() asking for an unbuffered paint must not start a repaint inside the repaint.
+  if (!Drawable::redrawsEnabled() || painting_) return false;
+  std::vector<Kw::Box<int>> areas;
+  for (const auto& a : given) {
+    const Kw::Box<int> on = a.intersection(canvas()->rootRect());
+    if (!on.empty()) areas.push_back(on);
+  }
+  if (areas.empty()) return false;
   painting_ = &session;
   session.beginFrame(areas);
   paintTree(session, canvas(), canvas()->rootRect(), areas);

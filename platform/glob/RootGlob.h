@@ -49,6 +49,16 @@ class RootGlob : public Glob, public CanvasHost {
   // outside it; the screen itself when there is neither.
   Glob* keyTarget() const;
 
+  // --- Event filters ---
+  // `filter` sees every pointer and key event of this screen before it is routed (before
+  // grabs, moves and drags too), through fsFilterThis(e, context), newest filter first; an
+  // answer of true consumes the event. The event's pos is in the filter's coordinates when it
+  // is on this screen. A filter may delete itself or others while filtering. Adding a filter
+  // again replaces its context. False for a null or deleted Glob.
+  bool addEventFilter(Glob* filter, void* context = nullptr);
+  void removeEventFilter(Glob* filter);
+  size_t eventFilterCount() const;
+
   // --- Queued delivery ---
   void post(const Event& e);
   // Delivers queued events in order, including ones queued meanwhile, up to `limit`.
@@ -112,6 +122,17 @@ class RootGlob : public Glob, public CanvasHost {
   // part drawn once; false when nothing was painted (nothing damaged, or redraws held back by
   // disableRedraws/refresh_off).
   bool paint(PaintSession& session);
+  // Repaints `areas` (root coordinates) with `session` now, whether damaged or not; what
+  // paint() does with the damaged areas. False when nothing was painted (redraws held back, a
+  // repaint going on, nothing of the areas on the screen).
+  bool paintAreas(PaintSession& session, const std::vector<Kw::Box<int>>& areas);
+  // The keeper of the screen's image paints a root area into it at once when asked, and
+  // answers whether it did (null: there is no image).
+  void setUnbufferedPainter(std::function<bool(const Kw::Box<int>&)> painter) {
+    unbufferedPainter_ = std::move(painter);
+  }
+  // Paints `rootArea` into the screen's image now (drawUnbuffered); false when it could not.
+  bool paintNow(const Kw::Box<int>& rootArea);
   // Called for each Glob asked to draw during paint().
   void setDrawObserver(std::function<void(Glob*)> observer) { drawObserver_ = std::move(observer); }
 
@@ -130,6 +151,8 @@ class RootGlob : public Glob, public CanvasHost {
 
  private:
   void updateHover(Glob* under);
+  // Offers `e` to the filters; true when one consumed it.
+  bool offerToFilters(Event& e);
   // Gives a pointer event to the move or drag going on, or starts a drag; true when taken.
   bool routeToSessions(const Event& probe, XY<int> pos, Event& e);
   bool maybeStartDrag(XY<int> pos);
@@ -152,6 +175,12 @@ class RootGlob : public Glob, public CanvasHost {
   DirtyRegion dirty_;
   PaintSession* painting_ = nullptr;
   std::function<void(Glob*)> drawObserver_;
+  std::function<bool(const Kw::Box<int>&)> unbufferedPainter_;
+  struct EventFilter {
+    GlobHandle<> glob;
+    void* context;
+  };
+  std::vector<EventFilter> filters_;       // oldest first
   std::vector<GlobHandle<>> inputScopes_;  // oldest first
   std::vector<GlobHandle<>> screenSized_;
   std::unique_ptr<GlobMoveSession> move_;

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include "buttons/Button.h"
 #include "foundation/ButtonWidget.h"
 #include "foundation/MessageReporter.h"
 #include "foundation/MessageSuffixes.h"
@@ -143,4 +144,30 @@ TEST(Reporting, AdaptorSeesClicksAndMessagesFirst) {
   adaptor->answer = kEventNotConsumed;
   panel.call_msg(&button, "other");
   EXPECT_EQ(button.messagesFallingThrough, 2);
+}
+
+TEST(Reporting, TheMessageEventNamesTheControlsCanvasAndGoesToTheParent) {
+  Harness h;
+  struct Receiver : Glob {
+    using Glob::Glob;
+    int react(Event* e) override {
+      if (!message_event(e)) return Glob::react(e);
+      type = e->type;
+      dest = e->dest;
+      eventCanvas = e->canvas;
+      text = e->text();
+      return 1;
+    }
+    int type = 0;
+    Glob* dest = nullptr;
+    Canvas* eventCanvas = nullptr;
+    String text;
+  };
+  Receiver panel(h.place(0, 0, 200, 200));
+  auto* button = new Button(L"Go", "go", GlobCreationInfo(60, 20, panel.canvas(), 10, 10));
+  h.clickOn(*button);
+  EXPECT_EQ(panel.type, kEventMessage);
+  EXPECT_EQ(panel.text, "go");
+  EXPECT_EQ(panel.dest, &panel);
+  EXPECT_EQ(panel.eventCanvas, button->canvas());
 }
