@@ -42,6 +42,8 @@ void ComboBox::makeTextBox() {
 void ComboBox::placeTextBox() {
   TextBox* box = textBox();
   if (!box) return;
+  // kButtonRoom narrower than the face; a suffix, whose drawing is ours to choose, takes its
+  // room out of the text box rather than out of the arrow column.
   const int w = std::max(1, width() - kButtonRoom - suffixWidth());
   const int h = std::max(1, height() - 2 * kTextBoxInset);
   box->reshape_canvas(kTextBoxInset, kTextBoxInset, w, h);

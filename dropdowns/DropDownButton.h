@@ -171,6 +171,10 @@ class DropDownButton : public Button {
       list->setMinWidth(width());
       const Kw::Box<int> r = canvas()->rootRect();
       if (list->popUp(*screen, XY<int>(r.x0, r.y0))) {
+        // The pop-up copied our palette, which is the pressed face's while we are down; the
+        // list is a menu and takes the menu colours of the palette around the button.
+        list->setPalette(surroundingPalette());
+        list->update();
         list_ = GlobHandle<T>(list);
         listShown(list);
         return true;
@@ -179,6 +183,12 @@ class DropDownButton : public Button {
     }
     set_state(kButtonUp, true);
     return false;
+  }
+
+  const Palette& surroundingPalette() const {
+    if (const Glob* around = parent()) return around->getPalette();
+    if (const RootGlob* screen = root()) return screen->getPalette();
+    return getPalette();
   }
 
   int reactToMessage(Event* e) {

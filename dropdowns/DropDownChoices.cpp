@@ -35,7 +35,7 @@ bool DropDownChoices::isChoosable(const std::vector<MenuItem>& items, int i) {
 
 bool DropDownChoices::isSteppable(const std::vector<MenuItem>& items, int i) {
   return isChoosable(items, i) && (items[i].getFlags() & kNoStepFlag) == 0 &&
-         numberFromMessage(items[i].msg()) >= 0;
+         !items[i].msg().empty();
 }
 
 int DropDownChoices::step(const std::vector<MenuItem>& items, int selected, int delta) {

@@ -4,8 +4,8 @@
 //
 // Decisions taken here:
 // - An entry can be chosen when it is a row of the list (not a group header, not an iconic
-//   item), is active and has a display string. The wheel and arrow keys also need its message
-//   to be a selection message ("DDMSG" and its index) and flag kNoStepFlag to be clear.
+//   item), is active and has a display string. The wheel and arrow keys also need it to have a
+//   message (of any kind) and flag kNoStepFlag to be clear.
 // - A selection message is "DDMSG" followed by decimal digits and nothing else; any other text
 //   ("DDMSG", "DDMSG-1", "DDMSG12x", a number too large) names no entry.
 #include <vector>

@@ -116,6 +116,9 @@ String DropDownMenuButton::buildMsgForItem(int n) {
   return DropDownChoices::selectMessage(n);
 }
 
+// The number in a selection message is the entry's place in the list, headers counted (as
+// buildMsgForItem gave it), so the mapping to the index setSelectedItem takes is the identity
+// over the entries; a number that names no entry maps to -1.
 int DropDownMenuButton::getLogicalItemIndexFromMessage(const String& msg) const {
   return DropDownChoices::indexFromMessage(msg, data_.items.size());
 }
@@ -155,7 +158,7 @@ void DropDownMenuButton::setNewWidgetValue(WString& value) {
 
 int DropDownMenuButton::react(Event* e) {
   if (mouse_wheel_event(e)) {
-    if (getWheelEnabled() && e->wheelSteps() != 0) handleMouseWheelDelta(e->wheelSteps());
+    if (getWheelEnabled()) handleMouseWheelDelta(e->wheelSteps());
     return 1;
   }
   if (key_press_event(e)) {
@@ -200,7 +203,8 @@ DropDownMenu* DropDownMenuButton::makeMenu() {
 }
 
 void DropDownMenuButton::listShown(DropDownMenu* list) {
-  list->scrollToItem(data_.selected);
+  // The keys start from the selection; an entry the user could not choose is only shown.
+  if (!list->highlightEntry(data_.selected)) list->scrollToItem(data_.selected);
 }
 
 // --- Settings ---

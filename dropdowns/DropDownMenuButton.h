@@ -20,8 +20,11 @@
 // - setSelectedItem refuses (false, selection kept, a diagnostic) an index that names no
 //   entry, a group header or an iconic item, and a name that no entry shows. Inactive entries
 //   may be selected by the program; the user cannot choose them.
-// - Stepping lands only on entries the user could choose whose message selects them and whose
-//   flag DropDownChoices::kNoStepFlag (4) is clear; the list still offers the others.
+// - Stepping lands only on entries the user could choose that have a message and whose flag
+//   DropDownChoices::kNoStepFlag (4) is clear; the list still offers the others. An action
+//   entry (below) is stepped onto like any other and becomes the selection.
+// - A wheel event of zero steps counts as a step down (toward later entries), as every delta
+//   of 0 or less does.
 // - The label is the selected entry's display string; with nothing selected, the title given
 //   at construction. The parent hears "ddMenuBtnMsg" only for the user's choices and steps,
 //   never for setSelectedItem.
@@ -91,7 +94,7 @@ class DropDownMenuButton : public DropDownButton<DropDownMenu> {
   void autoSize();
 
   // --- The list ---
-  DropDownMenu* generateDropDown() { return makeMenu(); }
+  virtual DropDownMenu* generateDropDown() { return makeMenu(); }
   virtual bool handleDropDownMessage(const String& msg) override;
   virtual void informOwner();
   virtual void handleMouseWheelDelta(int delta);

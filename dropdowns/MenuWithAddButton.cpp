@@ -1,7 +1,7 @@
 #include "dropdowns/MenuWithAddButton.h"
 
 #include "buttons/Button.h"
-#include "platform/glib/look/DropDownLook.h"
+#include "platform/glib/Painter.h"
 
 const char* const MenuWithAddButton::AddMsg_ = "MenuAdd";
 
@@ -37,9 +37,16 @@ int MenuWithAddButton::react(Event* e) {
   return DropDownMenu::react(e);
 }
 
+void MenuWithAddButton::draw() {
+  DropDownMenu::draw();
+  Glib::Painter p(*canvas());
+  if (!p.active()) return;
+  Glib::DropDownLook(getPalette()).addRowRule(p, Kw::Box<int>(1, 1, width() - 1, footHeight()));
+}
+
 void MenuWithAddButton::reshape() {
   DropDownMenu::reshape();
   if (Button* b = addButton()) {
-    b->reshape_canvas(1, 1, std::max(1, width() - 2), Glib::DropDownLook::kAddRowHeight - 1);
+    b->reshape_canvas(1, 1, std::max(1, width() - 2), footHeight() - 2);
   }
 }

@@ -5,8 +5,11 @@
 //
 // Decisions where the behaviour was left open:
 // - The add row is a flat button (message "MenuAdd") across the foot of the list,
-//   Glib::DropDownLook::kAddRowHeight pixels high, labelled kDefaultAddLabel unless told.
+//   Glib::DropDownLook::kAddRowHeight pixels high, labelled kDefaultAddLabel unless told, under
+//   a rule that parts it from the rows. A long list scrolls above it: the rows and the scroll
+//   bar stop at the rule.
 #include "dropdowns/DropDownMenu.h"
+#include "platform/glib/look/DropDownLook.h"
 
 class Button;
 
@@ -22,7 +25,11 @@ class MenuWithAddButton : public DropDownMenu {
   Button* addButton() const;
   int calculateHeight() const override;
   int react(Event* e) override;
+  void draw() override;
   void reshape() override;
+
+ protected:
+  int footHeight() const override { return Glib::DropDownLook::kAddRowHeight; }
 
  private:
   GlobHandle<> addButton_;

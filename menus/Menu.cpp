@@ -350,7 +350,9 @@ void Menu::relayout() {
   }
   if (ScrollBar* bar = scrollBar()) {
     const int t = ScrollBar::thickness();
-    bar->reshape_canvas(w - 1 - t, 1, t, std::max(ScrollBar::minSizePixels(), rowsTop() - 1));
+    const int foot = footHeight();
+    bar->reshape_canvas(w - 1 - t, 1 + foot, t,
+                        std::max(ScrollBar::minSizePixels(), rowsTop() - 1 - foot));
   }
   int k = 0;
   for (const auto& [index, g] : widgets_) {
@@ -394,7 +396,7 @@ void Menu::rebuildVisible() {
   const int ih = itemHeight_;
   for (int r = scrollOffset_ / ih; r < static_cast<int>(rows_.size()); ++r) {
     const int rowTop = top - (r * ih - scrollOffset_);
-    if (rowTop <= 0) break;
+    if (rowTop <= footHeight()) break;
     visible_.push_back(VisibleMenuItem{Kw::Box<int>(1, rowTop - ih, right, rowTop), rows_[r]});
   }
   if (choiceCount_ > 0) placeChoiceWidgets();
@@ -446,13 +448,14 @@ bool Menu::scrollToItem(int index) {
 
 Kw::Box<int> Menu::itemArea(int index) const {
   for (const VisibleMenuItem& v : visible_) {
-    if (v.index == index) return v.area.intersection(Kw::Box<int>(0, 0, rowsRight(), rowsTop()));
+    if (v.index == index)
+      return v.area.intersection(Kw::Box<int>(0, footHeight(), rowsRight(), rowsTop()));
   }
   return Kw::Box<int>();
 }
 
 int Menu::findItemAtPos(const XY<int>& pos) const {
-  if (pos.y >= rowsTop() || pos.y < 0) return -1;
+  if (pos.y >= rowsTop() || pos.y < footHeight()) return -1;
   for (const VisibleMenuItem& v : visible_) {
     if (v.area.contains(pos)) return v.index;
   }

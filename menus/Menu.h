@@ -179,6 +179,12 @@ class Menu : public Glob, public ListViewWidget {
   virtual int handleMessageEvent(const String& msg, Glob* sender);
   virtual int handleScrollBarMessages(const String& msg);
   virtual int handleMouseEvent(Event* e);
+  // Room at the foot of the pop-up, below the rows, that rows and the scroll bar keep clear of
+  // (a subclass's own strip); the subclass counts it in calculateHeight.
+  virtual int footHeight() const { return 0; }
+  // For subclasses that drive the rows from elsewhere (a list's own keys).
+  void setHighlight(int index);
+  void chooseItem(int index);
 
  private:
   void init(Glob* owner, int width, int mode);
@@ -205,10 +211,8 @@ class Menu : public Glob, public ListViewWidget {
   int rowsTop() const;
   int rowsRight() const;
   void calcHighlightItem(const XY<int>& pos);
-  void setHighlight(int index);
   void redrawItem(int index);
   void toggleGroup(int index);
-  void chooseItem(int index);
   void chooseIconic(int index);
   // Sends the owner `msg`; false when the pop-up is gone afterwards.
   bool tellOwner(const String& msg);

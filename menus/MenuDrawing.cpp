@@ -15,7 +15,7 @@ void Menu::draw() {
   Glib::Painter p(*canvas());
   if (!p.active()) return;
   drawBackground(p);
-  p.pushClip(Kw::Box<int>(0, 0, rowsRight(), rowsTop()));
+  p.pushClip(Kw::Box<int>(0, footHeight(), rowsRight(), rowsTop()));
   for (const VisibleMenuItem& row : visible_) drawMenuItem(p, row);
   p.popClip();
   Glib::MenuLook(getPalette()).frame(p);

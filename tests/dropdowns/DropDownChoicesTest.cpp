@@ -39,8 +39,11 @@ TEST(DropDownChoices, SteppingSkipsWhatCannotBeSteppedAndDoesNotWrap) {
   EXPECT_TRUE(DropDownChoices::isChoosable(items, 2));  // still offered in the list
   EXPECT_FALSE(DropDownChoices::isChoosable(items, 1));
   EXPECT_FALSE(DropDownChoices::isChoosable(items, 4));
-  // A header keeps no message; an item with a message of its own keeps it and is not stepped.
+  // A header keeps no message; an item with a message of its own keeps it and is stepped onto
+  // like any entry with a message; an entry left without one is not.
   EXPECT_EQ(items[4].msg(), "");
   items[3].msg("custom");
+  EXPECT_EQ(DropDownChoices::step(items, 0, -1), 3);
+  items[3].msg("");
   EXPECT_EQ(DropDownChoices::step(items, 0, -1), 5);
 }

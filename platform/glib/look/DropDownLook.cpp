@@ -52,4 +52,9 @@ Colour DropDownLook::suffixText(const Colour& label) const {
   return mix(label, palette_.get(Palette::Base), kSuffixFade);
 }
 
+void DropDownLook::addRowRule(Painter& p, const Kw::Box<int>& row) const {
+  if (row.empty()) return;
+  p.fillRect(Kw::Box<int>(row.x0, row.y1 - 1, row.x1, row.y1), palette_.get(Palette::Shadow));
+}
+
 }  // namespace Glib

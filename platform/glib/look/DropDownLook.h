@@ -44,6 +44,8 @@ class DropDownLook {
   // The tick that marks the selected entry in the glyph column of its row.
   void selectionMark(Painter& p, const Kw::Box<int>& row, int glyphColumn, const Colour& c) const;
   Colour suffixText(const Colour& label) const;
+  // The rule along the top edge of a list's add row `row`.
+  void addRowRule(Painter& p, const Kw::Box<int>& row) const;
 
  private:
   const Palette& palette_;
