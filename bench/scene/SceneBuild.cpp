@@ -42,16 +42,34 @@ Glob* makeControl(int i, const GlobCreationInfo& info) {
 
 }  // namespace
 
+namespace {
+
+// The word and the number. The peers make theirs with std::to_string, which is cheap; its
+// wide twin goes through swprintf and would cost more than some of the controls.
+std::wstring numbered(const wchar_t* word, int i) {
+  wchar_t digits[12];
+  int n = 0;
+  do {
+    digits[n++] = static_cast<wchar_t>(L'0' + i % 10);
+    i /= 10;
+  } while (i > 0);
+  std::wstring s(word);
+  while (n > 0) s += digits[--n];
+  return s;
+}
+
+}  // namespace
+
 std::wstring labelOf(int i) {
   switch (kindOf(i)) {
     case Kind::Button:
-      return L"Button " + std::to_wstring(i);
+      return numbered(L"Button ", i);
     case Kind::Check:
-      return L"Check " + std::to_wstring(i);
+      return numbered(L"Check ", i);
     case Kind::Slider:
       return std::wstring();
     case Kind::Text:
-      return L"Text " + std::to_wstring(i);
+      return numbered(L"Text ", i);
   }
   return std::wstring();
 }

@@ -217,9 +217,19 @@ void Canvas::damage() {
 }
 
 void Canvas::damage(const Kw::Box<int>& localArea) {
-  if (!isMappedToRoot()) return;
-  const XY<int> o = rootOrigin();
-  damageRoot(localArea.translated(o.x, o.y).intersection(visibleRootRect()));
+  // One walk to the root: the area moves into each parent's coordinates and is clipped by each
+  // canvas on the way, and an unmapped canvas on the way means nothing shows.
+  Kw::Box<int> area = localArea;
+  for (const Canvas* c = this; c; c = c->parent_) {
+    if (!c->mapped_) return;
+    area = area.intersection(c->localBounds());
+    if (area.empty()) return;
+    if (c->isRoot()) {
+      if (CanvasHost* h = c->rare_->host) h->canvasDamaged(area);
+      return;
+    }
+    area = area.translated(c->rect_.x0, c->rect_.y0);
+  }
 }
 
 void Canvas::damageRoot(const Kw::Box<int>& rootArea) const {
