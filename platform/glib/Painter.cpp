@@ -20,7 +20,7 @@ uint16_t channel16(double v) {
 
 // Pixman takes premultiplied colours.
 pixman_color_t premultiplied(const Colour& c) {
-  const double a = std::clamp(c.a, 0.0, 1.0);
+  const double a = std::clamp(double{c.a}, 0.0, 1.0);
   return {channel16(c.r * a), channel16(c.g * a), channel16(c.b * a), channel16(a)};
 }
 

@@ -1,12 +1,13 @@
 #pragma once
-// An RGBA colour with components in 0..1.
+// An RGBA colour with components in 0..1. Single precision: every control holds several, and
+// a float is still far finer than the 16-bit channels the drawing layer hands on.
 #include <cstdint>
 
 struct Colour {
-  double r = 0.0, g = 0.0, b = 0.0, a = 1.0;
+  float r = 0.0f, g = 0.0f, b = 0.0f, a = 1.0f;
 
   constexpr Colour() = default;
-  constexpr Colour(double rv, double gv, double bv, double av = 1.0) : r(rv), g(gv), b(bv), a(av) {}
+  constexpr Colour(double rv, double gv, double bv, double av = 1.0) : r(float(rv)), g(float(gv)), b(float(bv)), a(float(av)) {}
   static constexpr Colour fromRgb8(int r8, int g8, int b8, int a8 = 255) {
     return Colour(r8 / 255.0, g8 / 255.0, b8 / 255.0, a8 / 255.0);
   }

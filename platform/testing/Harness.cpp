@@ -134,7 +134,7 @@ uint32_t Harness::argb(const Colour& c) {
   auto byte = [](double v) {
     return static_cast<uint32_t>(std::lround(std::clamp(v, 0.0, 1.0) * 255.0));
   };
-  const double a = std::clamp(c.a, 0.0, 1.0);
+  const double a = std::clamp(double{c.a}, 0.0, 1.0);
   return byte(a) << 24 | byte(c.r * a) << 16 | byte(c.g * a) << 8 | byte(c.b * a);
 }
 
