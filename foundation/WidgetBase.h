@@ -5,6 +5,7 @@
 // without detachFrom first stays attached to both, and both push values to it. That is safe:
 // the control remembers every adaptor it is attached to and leaves all of them when destroyed,
 // and an adaptor destroyed first is forgotten.
+#include <memory>
 #include <vector>
 
 #include "foundation/AdaptorBase.h"
@@ -26,5 +27,9 @@ class WidgetBase {
 
  private:
   friend class AdaptorBase;
-  std::vector<AdaptorBase*> attachedTo_;
+  void addAttachment(AdaptorBase* a);
+  void dropAttachment(const AdaptorBase* a);
+  // The adaptors this control is attached to; made at the first attachment, since most
+  // controls are never bound.
+  std::unique_ptr<std::vector<AdaptorBase*>> attachedTo_;
 };

@@ -46,12 +46,15 @@ TextBoxBase::~TextBoxBase() = default;
 void TextBoxBase::init() {
   font_ = Glib::FontPtr(Glib::fonts().get(fontDesc_));
   // The model asks only once the box is built, from user input or the owner's calls.
-  TextEditModel::Hooks hooks;
-  hooks.allows = [this](wchar_t ch) { return isAllowed(ch); };
-  hooks.moveCaret = [this](TextEditModel::SeekMethod method, int index) {
-    updateCurrentPosition(static_cast<Glib::iFont::eCharSeekMethod>(method), index);
-  };
-  model_.setHooks(std::move(hooks));
+  model_.setOwner(this);
+}
+
+bool TextBoxBase::ownerAllows(wchar_t ch) {
+  return isAllowed(ch);
+}
+
+void TextBoxBase::ownerMovesCaret(TextEditModel::SeekMethod method, int index) {
+  updateCurrentPosition(static_cast<Glib::iFont::eCharSeekMethod>(method), index);
 }
 
 // --- Settings ---

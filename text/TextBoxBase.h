@@ -43,7 +43,7 @@
 #include "text/TextCursor.h"
 #include "text/TextEditModel.h"
 
-class TextBoxBase : public StandardPanel, public GlobTabStop {
+class TextBoxBase : public StandardPanel, public GlobTabStop, private TextEditModel::Owner {
  public:
   enum CallbackEvent : int32_t {
     FocusGained = 0,
@@ -188,6 +188,9 @@ class TextBoxBase : public StandardPanel, public GlobTabStop {
   };
 
   void init();
+  // The model's owner: the box's own character filter and caret moves.
+  bool ownerAllows(wchar_t ch) override;
+  void ownerMovesCaret(TextEditModel::SeekMethod method, int index) override;
 
   bool editable_ = true;
   double lastKeyTime_ = -1e18;

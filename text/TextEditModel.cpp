@@ -77,8 +77,8 @@ int TextEditModel::seek(SeekMethod method, int from, int index) const {
 
 void TextEditModel::moveCaret(SeekMethod method, int index) {
   if (seek(method, caret_, index) != caret_) {
-    if (hooks_.moveCaret) {
-      hooks_.moveCaret(method, index);
+    if (owner_) {
+      owner_->ownerMovesCaret(method, index);
     } else {
       applyCaretMove(method, index);
     }

@@ -11,11 +11,11 @@
 //
 // Decisions where the text box leaves room:
 //   - Printable means `CharClassifier::isPrintable`, a fixed table independent of the locale.
-//   - The owner's say (`setHooks`): a text box decides which characters go in and carries out
+//   - The owner's say (`setOwner`): a text box decides which characters go in and carries out
 //     every caret move itself. Every character that typing or a paste would insert is put to
 //     the character hook; every caret move that an edit, a key, an undo or a selection makes is
-//     put to the caret hook, once per change: a move that would leave the caret where it is is
-//     not made. Whatever the hook does, the caret stays within the text.
+//     put to the owner, once per change: a move that would leave the caret where it is is
+//     not made. Whatever the owner does, the caret stays within the text.
 //   - Paste removes the text it replaces (the selection) first, moving the caret to where it
 //     stood, and then puts each of its characters to the filter against the text as it stands
 //     then, before any of them is inserted; so a paste that starts short of the limit goes in
@@ -154,13 +154,18 @@ class TextEditModel {
   bool isAllowed(wchar_t ch) const;
 
   // --- The owner's say ---
-  struct Hooks {
-    // Whether a character may go in; without it, isAllowed.
-    std::function<bool(wchar_t)> allows;
-    // Carries out a caret move; it should end in applyCaretMove. Without it, applyCaretMove.
-    std::function<void(SeekMethod, int)> moveCaret;
+  // One pointer rather than two callbacks: every text box has a model.
+  class Owner {
+   public:
+    // Whether a character may go in (without an owner: isAllowed).
+    virtual bool ownerAllows(wchar_t ch) = 0;
+    // Carries out a caret move; it should end in applyCaretMove (without an owner: just that).
+    virtual void ownerMovesCaret(SeekMethod method, int index) = 0;
+
+   protected:
+    ~Owner() = default;
   };
-  void setHooks(Hooks hooks) { hooks_ = std::move(hooks); }
+  void setOwner(Owner* owner) { owner_ = owner; }
 
   // --- Editing ---
   // Types one character: in overwrite mode with no selection it replaces the character after
@@ -201,7 +206,7 @@ class TextEditModel {
   bool handleCaretKey(unsigned code, bool ctrl, bool shift);
   bool eraseKey(bool forward, bool ctrl);
 
-  bool allows(wchar_t ch) const { return hooks_.allows ? hooks_.allows(ch) : isAllowed(ch); }
+  bool allows(wchar_t ch) const { return owner_ ? owner_->ownerAllows(ch) : isAllowed(ch); }
   // Replaces [from, to) by the characters of `s` that the filter and the limit keep, with an
   // undo item; the caret and selection at the call are the item's state before.
   bool replaceRange(int from, int to, const WString& s);
@@ -230,5 +235,5 @@ class TextEditModel {
   wchar_t mask_ = 0;
 
   EditHistory history_;
-  Hooks hooks_;
+  Owner* owner_ = nullptr;
 };

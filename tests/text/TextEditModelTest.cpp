@@ -1,5 +1,7 @@
 #include <gtest/gtest.h>
 
+#include <functional>
+
 #include "platform/glob/Event.h"
 #include "platform/kw/CharClassifier.h"
 #include "text/TextEditModel.h"
@@ -177,21 +179,37 @@ TEST(TextEditModel, SizeLimitOnTypingAndPaste) {
   EXPECT_EQ(m.text(), L"AByz!??");
 }
 
-TEST(TextEditModel, HooksSeeEveryCharacterAndEveryCaretMoveOnce) {
+// An owner made of two functions; a missing one answers as the model alone would.
+struct FunctionOwner : Model::Owner {
+  explicit FunctionOwner(Model& m) : model(m) {}
+  bool ownerAllows(wchar_t ch) override { return allows ? allows(ch) : model.isAllowed(ch); }
+  void ownerMovesCaret(Model::SeekMethod method, int index) override {
+    if (moveCaret) {
+      moveCaret(method, index);
+    } else {
+      model.applyCaretMove(method, index);
+    }
+  }
+  Model& model;
+  std::function<bool(wchar_t)> allows;
+  std::function<void(Model::SeekMethod, int)> moveCaret;
+};
+
+TEST(TextEditModel, TheOwnerSeesEveryCharacterAndEveryCaretMoveOnce) {
   Model m = withText(L"one two", 7);
-  std::vector<std::pair<int, int>> moves;  // (caret before, caret after) of each hook call
+  std::vector<std::pair<int, int>> moves;  // (caret before, caret after) of each owner call
   WString asked;
-  Model::Hooks hooks;
-  hooks.allows = [&](wchar_t ch) {
+  FunctionOwner owner(m);
+  owner.allows = [&](wchar_t ch) {
     asked += ch;
     return ch != L'x' && m.isAllowed(ch);
   };
-  hooks.moveCaret = [&](Model::SeekMethod method, int index) {
+  owner.moveCaret = [&](Model::SeekMethod method, int index) {
     const int before = m.caret();
     m.applyCaretMove(method, index);
     moves.emplace_back(before, m.caret());
   };
-  m.setHooks(hooks);
+  m.setOwner(&owner);
 
   // Every path that inserts asks about each character, and every move is seen once, from
   // where the caret stood.
@@ -212,8 +230,10 @@ TEST(TextEditModel, HooksSeeEveryCharacterAndEveryCaretMoveOnce) {
   EXPECT_EQ(moves, expected);
   EXPECT_EQ(m.caret(), 0);
 
-  // A hook that refuses a move leaves the caret inside the text all the same.
-  m.setHooks({nullptr, [](Model::SeekMethod, int) {}});
+  // An owner that refuses a move leaves the caret inside the text all the same.
+  FunctionOwner refuses(m);
+  refuses.moveCaret = [](Model::SeekMethod, int) {};
+  m.setOwner(&refuses);
   m.setCaret(2);
   EXPECT_EQ(m.caret(), 0);
   m.setText(L"");
