@@ -130,7 +130,7 @@ void Button::copySettingsFrom(const Button& other) {
   upBackCol = other.upBackCol;
   downBackCol = other.downBackCol;
   set_message(other.get_message().c_str());
-  procedure_ = other.procedure_;
+  procedure_ = other.procedure_ ? std::make_unique<ButtonProcedure>(*other.procedure_) : nullptr;
   setActive(other.isActive(), false);
   ignoreMouseClicks = other.ignoreMouseClicks;
   applyStatePalette();
@@ -536,7 +536,7 @@ void Button::draw() {
   drawBackground();
   drawEdge();
   drawText();
-  if (procedure_) procedure_(facepath(), state);
+  if (procedure_ && *procedure_) (*procedure_)(facepath(), state);
 }
 
 void Button::drawBackground() {
@@ -595,4 +595,8 @@ Kw::Ptr<iRegion> Button::path() {
   auto* outline = new BoxRegion(facepath());
   outline->add(addpath());
   return Kw::Ptr<iRegion>(outline);
+}
+
+void Button::set_procedure(ButtonProcedure procedure) {
+  procedure_ = procedure ? std::make_unique<ButtonProcedure>(std::move(procedure)) : nullptr;
 }

@@ -36,6 +36,7 @@
 //   the same parent canvas, at the same place and size.
 #include <cstdint>
 #include <functional>
+#include <memory>
 
 #include "buttons/ButtonSettings.h"
 #include "foundation/ButtonWidget.h"
@@ -165,7 +166,7 @@ class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
   void setTextStyle(Glib::TextStyles::TextStyle s);
   Glib::TextStyles::TextStyle getTextStyle() const { return settings_->textStyle; }
   const ButtonSettings& settings() const { return *settings_; }
-  void set_procedure(ButtonProcedure procedure) { procedure_ = std::move(procedure); }
+  void set_procedure(ButtonProcedure procedure);
   bool isMouseInside() const { return mouseInside; }
 
   // --- Colours ---
@@ -228,7 +229,8 @@ class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
   Colour upBackCol;
   Colour downBackCol;
   MessageReporter reporter_;  // the message string and the modifier word
-  ButtonProcedure procedure_;
+  // Few buttons draw through a procedure of their own: a pointer until one is set.
+  std::unique_ptr<ButtonProcedure> procedure_;
 
   static int dragThreshold_;
 };

@@ -89,9 +89,15 @@ void TextBoxBase::setCharacters(const WString& set, CharacterRestriction restric
   model_.setCharacters(set, static_cast<TextEditModel::CharacterRestriction>(restriction));
 }
 
+const WString& TextBoxBase::getGhostLabel() const {
+  static const WString none;
+  return rare_ ? rare_->ghostLabel : none;
+}
+
 void TextBoxBase::setGhostLabel(const WString& label) {
-  if (label == ghostLabel_) return;
-  ghostLabel_ = label;
+  if (label == getGhostLabel()) return;
+  if (!rare_) rare_ = std::make_unique<Rare>();
+  rare_->ghostLabel = label;
   update();
 }
 
@@ -126,17 +132,18 @@ void TextBoxBase::setFont(const Glib::FontDesc& font) {
 // --- Owner callbacks ---
 
 void TextBoxBase::requestCallback(const String& message, Glob* handler, CallbackEvent event) {
-  callbacks_.push_back(Callback{event, message, GlobHandle<>(handler), handler == nullptr});
+  if (!rare_) rare_ = std::make_unique<Rare>();
+  rare_->callbacks.push_back(Callback{event, message, GlobHandle<>(handler), handler == nullptr});
 }
 
 void TextBoxBase::informOwner(CallbackEvent event, bool immediate, int keyCode) {
-  if (callbacks_.empty()) return;
+  if (!rare_ || rare_->callbacks.empty()) return;
   GlobHandle<> self(this);
   Event e(kEventMessage);
   e.setSender(this);
   e.word2 = static_cast<uint32_t>(keyCode);
   // A handler may add registrations or delete this box: walk a copy.
-  const std::vector<Callback> registrations = callbacks_;
+  const std::vector<Callback> registrations = rare_->callbacks;
   for (const Callback& c : registrations) {
     if (c.event != event) continue;
     Glob* target = c.toParent ? (self ? parent() : nullptr) : c.handler.get();

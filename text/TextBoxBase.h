@@ -32,6 +32,7 @@
 //   canCopyText says no, Paste with an empty clipboard. Chosen entries come back as the
 //   messages the box handles.
 #include <cstdint>
+#include <memory>
 #include <vector>
 
 #include "foundation/GlobTabStop.h"
@@ -101,7 +102,7 @@ class TextBoxBase : public StandardPanel, public GlobTabStop, private TextEditMo
   eEditMode getEditMode() const;
   void setCharacters(const WString& set, CharacterRestriction restriction);
   void setGhostLabel(const WString& label);
-  const WString& getGhostLabel() const { return ghostLabel_; }
+  const WString& getGhostLabel() const;
   void setCaretColour(const Colour& colour);
   Colour getCaretColour() const;
   // Virtual so that a box inside another control can show its owner's text colour.
@@ -112,7 +113,7 @@ class TextBoxBase : public StandardPanel, public GlobTabStop, private TextEditMo
   // --- Owner callbacks ---
   void requestCallback(const String& message, Glob* handler, CallbackEvent event);
   void informOwner(CallbackEvent event, bool immediate, int keyCode);
-  std::size_t callbackCount() const { return callbacks_.size(); }
+  std::size_t callbackCount() const { return rare_ ? rare_->callbacks.size() : 0; }
 
   bool isRestricted(wchar_t ch) const { return model_.isRestricted(ch); }
   static bool sameCharType(wchar_t a, wchar_t b);
@@ -194,9 +195,13 @@ class TextBoxBase : public StandardPanel, public GlobTabStop, private TextEditMo
 
   bool editable_ = true;
   double lastKeyTime_ = -1e18;
-  std::vector<Callback> callbacks_;
+  // What few boxes have: owners to call back and a ghost label. Made when first set.
+  struct Rare {
+    std::vector<Callback> callbacks;
+    WString ghostLabel;
+  };
+  std::unique_ptr<Rare> rare_;
   GlobHandle<TextCursor> caret_;
-  WString ghostLabel_;
   Colour caretColour_;
   bool caretColourSet_ = false;
   Glib::FontDesc fontDesc_;
