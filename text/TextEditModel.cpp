@@ -151,16 +151,21 @@ wchar_t TextEditModel::characterAtCaret() const {
 // --- Settings ---
 
 void TextEditModel::setCharacters(const WString& set, CharacterRestriction restriction) {
-  charSet_ = set;
+  charSet_ = set.empty() ? nullptr : std::make_unique<WString>(set);
   restriction_ = restriction;
+}
+
+const WString& TextEditModel::characterSet() const {
+  static const WString none;
+  return charSet_ ? *charSet_ : none;
 }
 
 bool TextEditModel::isRestricted(wchar_t ch) const {
   switch (restriction_) {
     case CharacterRestriction::OnlyListed:
-      return charSet_.find(ch) == WString::npos;
+      return characterSet().find(ch) == WString::npos;
     case CharacterRestriction::AllButListed:
-      return charSet_.find(ch) != WString::npos;
+      return characterSet().find(ch) != WString::npos;
     case CharacterRestriction::None:
       break;
   }

@@ -41,6 +41,7 @@
 //     selection afterwards.
 #include <cstdint>
 #include <functional>
+#include <memory>
 #include <string_view>
 #include <utility>
 
@@ -136,7 +137,7 @@ class TextEditModel {
   void setEditMode(EditMode mode) { mode_ = mode; }
   EditMode editMode() const { return mode_; }
   void setCharacters(const WString& set, CharacterRestriction restriction);
-  const WString& characterSet() const { return charSet_; }
+  const WString& characterSet() const;
   CharacterRestriction restriction() const { return restriction_; }
   // 0 means unlimited.
   void setSizeLimit(std::uint64_t limit) { sizeLimit_ = limit; }
@@ -229,7 +230,7 @@ class TextEditModel {
   int selEnd_ = -1;
 
   EditMode mode_ = EditMode::Insert;
-  WString charSet_;
+  std::unique_ptr<WString> charSet_;  // made when a set is given: most boxes take anything
   CharacterRestriction restriction_ = CharacterRestriction::None;
   std::uint64_t sizeLimit_ = 0;
   wchar_t mask_ = 0;

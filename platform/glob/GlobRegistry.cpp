@@ -18,10 +18,9 @@ struct Node {
   Leaf* leaves[size_t{1} << kNodeBits];
 };
 
-struct Slot {
-  const Glob* glob = nullptr;
-  uint32_t generation = 1;
-};
+// A slot is its generation: the identity a Glob was given names its slot and the generation
+// it had then, and leaving moves the generation on. Four bytes per slot.
+using Slot = uint32_t;
 
 struct State {
   std::vector<Slot> slots;
@@ -97,22 +96,19 @@ uint64_t GlobRegistry::enter(const Glob* g) {
     s.freeSlots.pop_back();
   } else {
     slot = static_cast<uint32_t>(s.slots.size());
-    s.slots.emplace_back();
+    s.slots.push_back(1);  // generation 0 is never handed out, so no identity is ever 0
   }
-  s.slots[slot].glob = g;
   ++s.live;
   markAddress(g, true);
-  return (uint64_t{s.slots[slot].generation} << 32) | slot;
+  return (uint64_t{s.slots[slot]} << 32) | slot;
 }
 
 void GlobRegistry::leave(const Glob* g, uint64_t identity) {
   if (!isLive(g, identity)) return;
   State& s = state();
   const auto slot = static_cast<uint32_t>(identity);
-  Slot& entry = s.slots[slot];
-  entry.glob = nullptr;
-  // Generation 0 is never handed out, so no identity is ever 0.
-  if (++entry.generation == 0) entry.generation = 1;
+  Slot& generation = s.slots[slot];
+  if (++generation == 0) generation = 1;
   s.freeSlots.push_back(slot);
   --s.live;
   markAddress(g, false);
@@ -121,8 +117,7 @@ void GlobRegistry::leave(const Glob* g, uint64_t identity) {
 bool GlobRegistry::isLive(const Glob* g, uint64_t identity) {
   const State& s = state();
   const auto slot = static_cast<uint32_t>(identity);
-  return g && slot < s.slots.size() && s.slots[slot].glob == g &&
-         s.slots[slot].generation == static_cast<uint32_t>(identity >> 32);
+  return g && slot < s.slots.size() && s.slots[slot] == static_cast<uint32_t>(identity >> 32);
 }
 
 bool GlobRegistry::isLiveAddress(const void* p) {

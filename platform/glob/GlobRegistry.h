@@ -16,7 +16,8 @@ class GlobRegistry {
   static uint64_t enter(const Glob* g);
   // Forgets the Glob of that identity (from its destructor).
   static void leave(const Glob* g, uint64_t identity);
-  // Whether `g` is alive and is the Glob that was given `identity`.
+  // Whether the Glob that was given `identity` is still alive; `g` must be that Glob (handles
+  // keep the two together), and a null `g` is never alive.
   static bool isLive(const Glob* g, uint64_t identity);
   // Whether a live Glob has the address `p`.
   static bool isLiveAddress(const void* p);
