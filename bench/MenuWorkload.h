@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+#include "bench/NumberedLabel.h"
 #include "menus/Menu.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
@@ -26,7 +27,7 @@ class MenuWorkload {
     data.owner = owner_;
     data.items.reserve(static_cast<size_t>(itemCount));
     for (int i = 0; i < itemCount; ++i) {
-      data.items.emplace_back(label(i), "item");
+      data.items.emplace_back(numberedLabel(L"Item ", i), "item");
     }
     menu_ = new Menu(std::move(data));
   }
@@ -59,19 +60,6 @@ class MenuWorkload {
   Menu* menu() const { return menu_; }
 
  private:
-  // "Item " and the number, without the cost of formatted output.
-  static WString label(int i) {
-    wchar_t digits[12];
-    int n = 0;
-    do {
-      digits[n++] = static_cast<wchar_t>(L'0' + i % 10);
-      i /= 10;
-    } while (i > 0);
-    WString s = L"Item ";
-    while (n > 0) s += digits[--n];
-    return s;
-  }
-
   int pageHeight() const {
     return static_cast<int>(menu_->visibleItems().size() - 1) * menu_->itemHeight();
   }

@@ -1,5 +1,7 @@
 #include "bench/scene/SceneBuild.h"
 
+#include "bench/NumberedLabel.h"
+
 #include "buttons/Button.h"
 #include "buttons/Checkbox.h"
 #include "platform/glob/RootGlob.h"
@@ -42,34 +44,16 @@ Glob* makeControl(int i, const GlobCreationInfo& info) {
 
 }  // namespace
 
-namespace {
-
-// The word and the number. The peers make theirs with std::to_string, which is cheap; its
-// wide twin goes through swprintf and would cost more than some of the controls.
-std::wstring numbered(const wchar_t* word, int i) {
-  wchar_t digits[12];
-  int n = 0;
-  do {
-    digits[n++] = static_cast<wchar_t>(L'0' + i % 10);
-    i /= 10;
-  } while (i > 0);
-  std::wstring s(word);
-  while (n > 0) s += digits[--n];
-  return s;
-}
-
-}  // namespace
-
 std::wstring labelOf(int i) {
   switch (kindOf(i)) {
     case Kind::Button:
-      return numbered(L"Button ", i);
+      return numberedLabel(L"Button ", i);
     case Kind::Check:
-      return numbered(L"Check ", i);
+      return numberedLabel(L"Check ", i);
     case Kind::Slider:
       return std::wstring();
     case Kind::Text:
-      return numbered(L"Text ", i);
+      return numberedLabel(L"Text ", i);
   }
   return std::wstring();
 }
