@@ -4,13 +4,13 @@
 
 #include "platform/misc/Diagnostics.h"
 
-RootRenderer::RootRenderer(RootGlob& root) : root_(root) {
+RootRenderer::RootRenderer(RootGlob& root) : root_(root), rootAlive_(&root) {
   makeSurface(root.canvas()->width(), root.canvas()->height());
   root_.setUnbufferedPainter([this](const Kw::Box<int>& area) { return renderNow(area); });
 }
 
 RootRenderer::~RootRenderer() {
-  root_.setUnbufferedPainter(nullptr);
+  if (RootGlob* root = rootAlive_.get()) root->setUnbufferedPainter(nullptr);
   session_.reset();
   cairo_surface_destroy(surface_);
 }

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "platform/glib/CairoPaintSession.h"
+#include "platform/glob/GlobHandle.h"
 #include "platform/glob/RootGlob.h"
 
 class RootRenderer {
@@ -50,6 +51,9 @@ class RootRenderer {
   bool renderNow(const Kw::Box<int>& rootArea);
 
   RootGlob& root_;
+  // The screen may go first (a window takes its Globs down before its image): the painter it
+  // holds is withdrawn only from a screen that is still there.
+  GlobHandle<RootGlob> rootAlive_;
   cairo_surface_t* surface_ = nullptr;
   std::unique_ptr<Glib::CairoPaintSession> session_;
   Kw::Box<int> changed_;
