@@ -8,6 +8,7 @@
 #include "platform/misc/Diagnostics.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
+#include "tests/values/ValuesTestSupport.h"
 #include "values/ScrollBar.h"
 
 namespace {
@@ -18,14 +19,8 @@ using Texts = std::vector<String>;
 // pixels, so a thumb of size s at position p covers 16 + 200 p to 16 + 200 (p + s).
 struct ScrollBarTest : ::testing::Test {
   ScrollBar* make(Orientation o, double pos, double size, bool resizable = false) {
-    ScrollBarInitArgs args(GlobCreationInfo(o == kHorizontal ? 232 : 0, o == kHorizontal ? 0 : 232,
-                                            parent.canvas(), 20, 20),
-                           o);
-    args.resizableThumb = resizable;
-    auto* b = new ScrollBar(args);
-    b->setThumbSize(size);
-    b->setThumbPos(pos);
-    return b;
+    return makeScrollBar(parent.canvas(), 20, 20, o == kHorizontal ? 232 : 0,
+                         o == kHorizontal ? 0 : 232, o, pos, size, resizable);
   }
   // A root point `along` pixels from the bar's decreasing end (left, or top of a vertical bar).
   XY<int> on(const ScrollBar& b, int along) const {

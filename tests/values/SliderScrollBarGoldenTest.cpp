@@ -3,6 +3,7 @@
 #include "platform/testing/GoldenImage.h"
 #include "platform/testing/Harness.h"
 #include "platform/testing/MessageProbe.h"
+#include "tests/values/ValuesTestSupport.h"
 #include "values/ScrollBar.h"
 #include "values/Slider.h"
 
@@ -37,15 +38,8 @@ Slider* slider(MessageProbe& parent, int x, int y, int w, int hgt, bool vertical
 
 ScrollBar* bar(MessageProbe& parent, int x, int y, int length, Orientation o, double pos,
                double size, bool resizable = false) {
-  ScrollBarInitArgs args(
-      GlobCreationInfo(static_cast<unsigned short>(length), static_cast<unsigned short>(length),
-                       parent.canvas(), x, y),
-      o);
-  args.resizableThumb = resizable;
-  auto* b = new ScrollBar(args);
-  b->setThumbSize(size);
-  b->setThumbPos(pos);
-  return b;
+  const auto side = static_cast<unsigned short>(length);
+  return makeScrollBar(parent.canvas(), x, y, side, side, o, pos, size, resizable);
 }
 
 }  // namespace

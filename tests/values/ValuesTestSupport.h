@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "foundation/ValAdaptorBase.h"
+#include "values/ScrollBar.h"
 
 // Accepts every value, keeps it as the model value, pushes it back to its controls, and
 // records each request with its change type. `onRequest` runs after the push.
@@ -36,3 +37,16 @@ class RecordingAdaptor : public ValAdaptorBase<T> {
   std::vector<Request> requests;
   std::function<void()> onRequest;
 };
+
+// A scroll bar made on `parent` at (x, y) with the requested size, its thumb `size` long at
+// `pos`; a resizable thumb on request.
+inline ScrollBar* makeScrollBar(Canvas* parent, int x, int y, unsigned short width,
+                                unsigned short height, Orientation o, double pos, double size,
+                                bool resizable = false) {
+  ScrollBarInitArgs args(GlobCreationInfo(width, height, parent, x, y), o);
+  args.resizableThumb = resizable;
+  auto* b = new ScrollBar(args);
+  b->setThumbSize(size);
+  b->setThumbPos(pos);
+  return b;
+}
