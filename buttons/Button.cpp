@@ -5,6 +5,7 @@
 
 #include <climits>
 #include <cmath>
+#include <utility>
 
 #include "buttons/ImageSearchPath.h"
 #include "platform/glib/FontCache.h"
@@ -37,8 +38,8 @@ GlobCreationInfo placementOf(const Button& b) {
 
 // --- Construction ---
 
-Button::Button(const WString& l, const String& message, const GlobCreationInfo& info)
-    : rect(info), GlobTabStop(this), label(l) {
+Button::Button(WString l, const String& message, const GlobCreationInfo& info)
+    : rect(info), GlobTabStop(this), label(std::move(l)) {
   set_message(message.c_str());
   init();
   post_init();

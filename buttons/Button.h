@@ -79,7 +79,8 @@ class Button : public rect, public ButtonWidget<WString>, public GlobTabStop {
   // The thinner bevel of the small buttons of a panel's title strip.
   static constexpr int kTitleBevelWidth = 2;
 
-  Button(const WString& label, const String& message, const GlobCreationInfo& info);
+  // The label is taken over (moved in) when given a temporary.
+  Button(WString label, const String& message, const GlobCreationInfo& info);
   Button(const WString& label, const char* message, unsigned short width, unsigned short height,
          int flag, Canvas* parent);
   explicit Button(const ButtonInitArgs& args);

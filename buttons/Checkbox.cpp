@@ -3,6 +3,7 @@
 #include "platform/glob/KeyCodes.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
@@ -250,9 +251,9 @@ String Checkbox::describeValue() const {
 
 // --- Look ---
 
-void Checkbox::setLabel(const WString& text) {
+void Checkbox::setLabel(WString text) {
   if (text == label_) return;
-  label_ = text;
+  label_ = std::move(text);
   update();
 }
 

@@ -143,7 +143,7 @@ class Checkbox : public StandardPanel, public ValWidget<bool>, public GlobTabSto
   void* getUserData() const { return userData; }
 
   // --- Look ---
-  void setLabel(const WString& text);
+  void setLabel(WString text);
   const WString& getLabel() const { return label_; }
   void setFont(const Glib::FontDesc& desc);
   const Glib::FontDesc& getFont() const { return settings_->font; }

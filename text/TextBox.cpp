@@ -279,13 +279,13 @@ int TextBox::countClick(XY<int> rootPos) {
 }
 
 int TextBox::caretIndexAt(int x) const {
-  return ruler_.indexAt(std::max<int64_t>(displayXToTextX(x), 0));
+  return ruler().indexAt(std::max<int64_t>(displayXToTextX(x), 0));
 }
 
 int TextBox::characterIndexAt(int x) const {
   const int64_t textX = std::max<int64_t>(displayXToTextX(x), 0);
-  const int index = ruler_.indexAt(textX);
-  return index > 0 && textX < ruler_.xOf(index) ? index - 1 : index;
+  const int index = ruler().indexAt(textX);
+  return index > 0 && textX < ruler().xOf(index) ? index - 1 : index;
 }
 
 // --- Focus ---
@@ -395,10 +395,10 @@ int64_t TextBox::displayXToTextX(int x) const {
 }
 
 int TextBox::caretDisplayX() const {
-  return textXToDisplayX(ruler_.xOf(model_.caret()));
+  return textXToDisplayX(ruler().xOf(model_.caret()));
 }
 
-void TextBox::relayout() {
+const TextRuler& TextBox::ruler() const {
   if (obfuscated_) {
     if (!ruler_.isMasked() || ruler_.length() != model_.length()) {
       ruler_.setMasked(kObfuscationChar, model_.length());
@@ -407,6 +407,10 @@ void TextBox::relayout() {
     ruler_.setText(model_.text());
   }
   rulerRevision_ = model_.revision();
+  return ruler_;
+}
+
+void TextBox::relayout() {
   windowStale_ = true;
   placeCaret();
 }
@@ -420,7 +424,7 @@ void TextBox::updateVisibleWindow() const {
   if (!windowStale_) return;
   windowStale_ = false;
   const int stretch = stretchWidth();
-  const int64_t textWidth = ruler_.width();
+  const int64_t textWidth = ruler().width();
   if (textWidth <= stretch) {
     scrollOffset_ = 0;
     const int w = static_cast<int>(textWidth);
@@ -439,7 +443,7 @@ void TextBox::updateVisibleWindow() const {
   }
   // Too wide: from the left margin, scrolled by the least that keeps the caret in view.
   textX_ = leftMargin_;
-  const int64_t caretX = ruler_.xOf(model_.caret());
+  const int64_t caretX = ruler().xOf(model_.caret());
   int64_t offset = scrollOffset_;
   if (caretX - offset < 0) offset = caretX;
   if (caretX - offset > stretch) offset = caretX - stretch;
@@ -513,15 +517,15 @@ void TextBox::drawText(Glib::Painter& p) {
   const int64_t from = displayXToTextX(stretch.x0);
   const int64_t to = displayXToTextX(stretch.x1);
   auto drawPieces = [&](const Colour& colour) {
-    ruler_.forEachPiece(from, to, [&](const WString& text, int, int64_t x) {
+    ruler().forEachPiece(from, to, [&](const WString& text, int, int64_t x) {
       p.textAt(text, XY<int>(textXToDisplayX(x), y), *font, colour);
     });
   };
 
   Kw::Box<int> selection;
   if (model_.hasSelection()) {
-    const int x0 = textXToDisplayX(ruler_.xOf(model_.selectionLow()));
-    const int x1 = textXToDisplayX(ruler_.xOf(model_.selectionHigh()));
+    const int x0 = textXToDisplayX(ruler().xOf(model_.selectionLow()));
+    const int x1 = textXToDisplayX(ruler().xOf(model_.selectionHigh()));
     selection = Kw::Box<int>(x0, std::max(1, y - 1), x1, std::min(h - 1, y + font->height() + 1))
                     .intersection(stretch);
   }

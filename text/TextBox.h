@@ -121,7 +121,8 @@ class TextBox : public TextBoxBase {
   }
   // The caret's x in the box (text x plus caret x less the scroll offset).
   int caretDisplayX() const;
-  const TextRuler& ruler() const { return ruler_; }
+  // The ruler brought up to date with the text: a box measures nothing until asked.
+  const TextRuler& ruler() const;
   // The font the text is shown in (the obfuscation face in obfuscated display).
   Glib::FontPtr displayFont() const;
   bool isGhostLabelVisible() const;
@@ -191,8 +192,8 @@ class TextBox : public TextBoxBase {
   int stretchWidth() const;
   int caretY() const;
 
-  TextRuler ruler_;
-  std::uint64_t rulerRevision_ = ~std::uint64_t{0};
+  mutable TextRuler ruler_;
+  mutable std::uint64_t rulerRevision_ = ~std::uint64_t{0};
   // Where the text sits: worked out from the text, caret and margins when first needed.
   mutable int scrollOffset_ = 0;
   mutable int textX_ = kDefaultMargin;

@@ -21,11 +21,14 @@ WString TextEditModel::textRange(int from, int to) const {
 }
 
 bool TextEditModel::setText(const WString& text, SeekMethod caretTo) {
-  if (text_ == text && hasSaved_ && saved_ == text && !modified_) return false;
-  text_ = text.size() > kMaxLength ? text.substr(0, kMaxLength) : text;
+  if (text_ == text && hasSaved_ && savedText() == text && !modified_) return false;
+  if (text.size() > kMaxLength) {
+    text_.assign(text, 0, kMaxLength);
+  } else {
+    text_ = text;
+  }
   ++revision_;
-  saved_ = text_;
-  hasSaved_ = true;
+  saveText();
   modified_ = false;
   clearSelection();
   history_.clear();
@@ -34,12 +37,19 @@ bool TextEditModel::setText(const WString& text, SeekMethod caretTo) {
 }
 
 void TextEditModel::saveText() {
-  saved_ = text_;
+  WString().swap(saved_);
+  savedIsText_ = true;
   hasSaved_ = true;
 }
 
+void TextEditModel::detachSaved() {
+  if (!savedIsText_) return;
+  saved_ = text_;
+  savedIsText_ = false;
+}
+
 bool TextEditModel::getChanged() const {
-  return hasSaved_ ? text_ != saved_ : !text_.empty();
+  return hasSaved_ ? text_ != savedText() : !text_.empty();
 }
 
 // --- Caret and selection ---
@@ -186,6 +196,7 @@ bool TextEditModel::isAllowed(wchar_t ch) const {
 void TextEditModel::applyReplace(std::size_t pos, std::size_t removeCount, const WString& insert) {
   pos = std::min(pos, text_.size());
   removeCount = std::min(removeCount, text_.size() - pos);
+  detachSaved();
   text_.replace(pos, removeCount, insert);
   ++revision_;
 }
@@ -354,7 +365,7 @@ bool TextEditModel::redo() {
 
 bool TextEditModel::revertToSaved() {
   if (!hasSaved_) return false;
-  if (text_ != saved_) {
+  if (!savedIsText_ && text_ != saved_) {
     // Record only the stretch between the common start and the common end.
     const std::size_t shorter = std::min(text_.size(), saved_.size());
     std::size_t prefix = 0;

@@ -88,7 +88,7 @@ class TextEditModel {
   // --- Saved text (Escape restores it) ---
   void saveText();
   bool hasSavedText() const { return hasSaved_; }
-  const WString& savedText() const { return saved_; }
+  const WString& savedText() const { return savedIsText_ ? text_ : saved_; }
   // True when the text differs from the saved text (with nothing saved: when it is not empty).
   bool getChanged() const;
   // Set by every edit; cleared by `setText`, Escape and `clearModified`.
@@ -214,13 +214,18 @@ class TextEditModel {
   // The characters of `s` that go in, judged against the text as it stands.
   WString keptCharacters(const WString& s) const;
   void applyReplace(std::size_t pos, std::size_t removeCount, const WString& insert);
+  // Gives the saved text a copy of its own before the text changes.
+  void detachSaved();
   void revertGroup(std::span<const EditHistory::Item> items);
   void replayGroup(std::span<const EditHistory::Item> items);
   static bool isContiguousTyping(std::span<const EditHistory::Item> items);
   int clampIndex(int index) const;
 
   WString text_;
+  // Until the first edit after a save the saved text is the text itself (`savedIsText_`) and
+  // `saved_` stays empty: most boxes are never edited and so never hold their text twice.
   WString saved_;
+  bool savedIsText_ = false;
   bool hasSaved_ = false;
   bool modified_ = false;
   std::uint64_t revision_ = 0;

@@ -390,6 +390,7 @@ TEST(TextEditModel, SetTextAndEscape) {
   m.handleKey(kEnd);
   m.handleKey(kBackspace);
   EXPECT_TRUE(m.getChanged());
+  EXPECT_EQ(m.savedText(), L"name");  // edits leave the saved text as it was
   EXPECT_TRUE(m.handleKey(kEscape));
   EXPECT_EQ(m.text(), L"name");
   EXPECT_EQ(m.selectedText(), L"name");
@@ -403,7 +404,11 @@ TEST(TextEditModel, SetTextAndEscape) {
   m.highlightAll(true);
   type(m, L"x");
   m.saveText();
+  EXPECT_EQ(m.savedText(), L"x");
+  EXPECT_FALSE(m.getChanged());
   type(m, L"yz");
+  EXPECT_EQ(m.savedText(), L"x");
+  EXPECT_TRUE(m.getChanged());
   m.handleKey(kLeft);
   m.handleKey(kEscape | kKeyShift);
   EXPECT_EQ(m.selectedText(), L"x");
