@@ -10,6 +10,7 @@
 #include "platform/glib/look/MarkLook.h"
 #include "platform/glib/look/PanelLook.h"
 #include "platform/glob/GlobHandle.h"
+#include "platform/kw/CrossCast.h"
 
 namespace {
 
@@ -26,7 +27,7 @@ GlobCreationInfo placementOf(const Checkbox& b) {
 Colour backgroundFrom(const Glob& box) {
   Glob* p = box.parent();
   if (!p) return box.getPalette().windowShade(3);
-  if (const auto* r = dynamic_cast<const rect*>(p)) return r->getcol();
+  if (const auto* r = Kw::crossCast<const rect>(p)) return r->getcol();
   return p->getPalette().get(Palette::Window);
 }
 

@@ -3,7 +3,7 @@
 #include "panels/StandardPanel.h"
 
 bool PanelWidgetList::mayHold(const Glob* widget) const {
-  return addresses_ && addresses_->count(widget) != 0;
+  return addresses_.contains(widget);
 }
 
 WidgetDetails* PanelWidgetList::findLiveEntry(const Glob* widget) {
@@ -33,24 +33,31 @@ bool PanelWidgetList::onPanel(const Glob* widget) const {
 
 bool PanelWidgetList::canAdopt(Glob* widget) const {
   if (!is_good_glob_ptr(widget) || widget->canvas()->isRoot() || findLive(widget)) return false;
-  for (const Glob* p = &panel_; p; p = p->parent()) {
-    if (p == widget) return false;
+  // The panel and its ancestors are the Globs whose canvases hold the panel's.
+  for (const Canvas* c = panel_.canvas(); c; c = c->parent()) {
+    if (c == widget->canvas()) return false;
   }
   return true;
 }
 
 const WidgetDetails& PanelWidgetList::insert(const WidgetDetails& d, Glob* insertAfter) {
   Glob* widget = d.get();
-  if (!onPanel(widget)) widget->canvas()->reparent(panel_.canvas());
+  // A widget that stands nowhere yet is put in its place before it joins the panel, so that it
+  // shows (and asks for a repaint) once, where it belongs.
+  const bool loose = !widget->canvas()->parent();
   auto at = list_.end();
   if (const WidgetDetails* after =
           is_good_glob_ptr(insertAfter) ? findLive(insertAfter) : nullptr) {
     at = list_.begin() + (after - list_.data()) + 1;
   }
-  if (!addresses_) addresses_ = std::make_unique<std::unordered_map<const Glob*, unsigned>>();
-  ++(*addresses_)[d.address];
+  addresses_.add(d.address);
   WidgetDetails& added = *list_.insert(at, d);
-  place(added);
+  if (loose) {
+    XY<int> corner;
+    if (cornerOf(added, corner)) moveTo(*widget, corner);
+  }
+  if (!onPanel(widget)) widget->canvas()->reparent(panel_.canvas());
+  if (!loose) place(added);
   return added;
 }
 
@@ -64,9 +71,7 @@ bool PanelWidgetList::remove(const Glob* widget, Glob*& live) {
   }
   const Glob* address = list_[index].address;
   list_.erase(list_.begin() + static_cast<std::ptrdiff_t>(index));
-  if (auto it = addresses_->find(address); it != addresses_->end() && --it->second == 0) {
-    addresses_->erase(it);
-  }
+  addresses_.remove(address);
   return true;
 }
 
@@ -123,16 +128,14 @@ Kw::Box<int> PanelWidgetList::outerBoxOf(const WidgetDetails& d) const {
   return Kw::Box<int>(r.x0 - s, r.y0 - s, r.x1 + s, r.y1 + s);
 }
 
-void PanelWidgetList::place(WidgetDetails& d) {
-  Glob* g = d.get();
-  if (!g || !onPanel(g)) return;
+bool PanelWidgetList::cornerOf(WidgetDetails& d, XY<int>& corner) {
+  const Glob* g = d.get();
   const XY<int> size(g->width(), g->height());
-  XY<int> corner;
   if (d.relative) {
     const WidgetDetails* ref = findLive(d.reference.get());
     if (!ref || !onPanel(ref->get())) {
       makeAbsolute(d);
-      return;
+      return false;
     }
     const int s = PanelGeometry::surroundWidth(d.surround);
     const Kw::Box<int> outer =
@@ -142,8 +145,19 @@ void PanelWidgetList::place(WidgetDetails& d) {
   } else {
     corner = PanelGeometry::placeFromOrigin(d.origin, d.pos, size, panel_.frame());
   }
-  const Kw::Box<int>& r = g->canvas()->rect();
-  if (r.x0 != corner.x || r.y0 != corner.y) g->translate_canvas(corner.x - r.x0, corner.y - r.y0);
+  return true;
+}
+
+void PanelWidgetList::moveTo(Glob& g, XY<int> corner) {
+  const Kw::Box<int>& r = g.canvas()->rect();
+  if (r.x0 != corner.x || r.y0 != corner.y) g.translate_canvas(corner.x - r.x0, corner.y - r.y0);
+}
+
+void PanelWidgetList::place(WidgetDetails& d) {
+  Glob* g = d.get();
+  if (!g || !onPanel(g)) return;
+  XY<int> corner;
+  if (cornerOf(d, corner)) moveTo(*g, corner);
 }
 
 void PanelWidgetList::placeAll() {
@@ -154,6 +168,6 @@ void PanelWidgetList::placeAll() {
 std::vector<WidgetDetails> PanelWidgetList::takeAll() {
   std::vector<WidgetDetails> out;
   out.swap(list_);
-  addresses_.reset();
+  addresses_.clear();
   return out;
 }

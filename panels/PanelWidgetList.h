@@ -7,11 +7,10 @@
 //
 // An entry whose child was deleted behind the panel's back stays, with a null widget, until
 // it is removed by its old address; every placement skips it.
-#include <memory>
-#include <unordered_map>
 #include <vector>
 
 #include "panels/WidgetDetails.h"
+#include "platform/kw/AddressCounts.h"
 #include "platform/kw/Box.h"
 
 class Glob;
@@ -67,6 +66,10 @@ class PanelWidgetList {
  private:
   WidgetDetails* findLiveEntry(const Glob* widget);
   void place(WidgetDetails& d);
+  // Where `d`'s rule puts its widget's corner; false when the rule cannot say (a relative
+  // entry whose reference is gone becomes absolute and stays where it is).
+  bool cornerOf(WidgetDetails& d, XY<int>& corner);
+  static void moveTo(Glob& g, XY<int> corner);
   void makeAbsolute(WidgetDetails& d);
 
   // Whether an entry may hold this address: a miss rules the widget out without a scan.
@@ -74,6 +77,6 @@ class PanelWidgetList {
 
   StandardPanel& panel_;
   std::vector<WidgetDetails> list_;
-  // How many entries were made for each address (dead ones included); made with the first.
-  std::unique_ptr<std::unordered_map<const Glob*, unsigned>> addresses_;
+  // How many entries were made for each address (dead ones included).
+  Kw::AddressCounts addresses_;
 };

@@ -11,6 +11,7 @@
 #include "panels/PanelStandardWidgets.h"
 #include "platform/glib/look/PanelLook.h"
 #include "platform/glob/RootGlob.h"
+#include "platform/kw/CrossCast.h"
 #include "platform/misc/Config.h"
 #include "platform/misc/Diagnostics.h"
 #include "platform/misc/configb.h"
@@ -300,22 +301,23 @@ void StandardPanel::adopt(const WidgetDetails& details, Glob* insertAfter) {
   const WidgetDetails added = widgets_.insert(details, insertAfter);
   positionStandardWidgets();
   joinTabOrder(details.widget.get(), insertAfter);
-  update();
+  // The newcomer was damaged as it joined; the ring the panel draws around it, if any, is new.
+  if (added.surround != SurroundNone) update(widgets_.outerBoxOf(added));
   handleWidgetAdded(added);
 }
 
 void StandardPanel::joinTabOrder(Glob* widget, Glob* insertAfter) {
-  auto* stop = dynamic_cast<TabOrderable*>(widget);
+  auto* stop = Kw::crossCast<TabOrderable>(widget);
   if (!stop) {
     // A composite control takes part through the stops it hands out, in its own order.
-    if (auto* host = dynamic_cast<TabOrderableHost*>(widget))
+    if (auto* host = Kw::crossCast<TabOrderableHost>(widget))
       tabOrder().addTabStops(*host, TabOrderManager::kAfterLast);
     return;
   }
   TabOrderManager& tabs = tabOrder();
   unsigned order = TabOrderManager::kAfterLast;
   if (auto* after =
-          is_good_glob_ptr(insertAfter) ? dynamic_cast<TabOrderable*>(insertAfter) : nullptr) {
+          is_good_glob_ptr(insertAfter) ? Kw::crossCast<TabOrderable>(insertAfter) : nullptr) {
     for (unsigned i = 0; i < tabs.numTabStops(); ++i) {
       if (tabs.getTabStopObject(i) != after) continue;
       const unsigned afterOrder = tabs.getTabStopTabOrder(i);
@@ -330,8 +332,8 @@ bool StandardPanel::removeWidget(Glob* widget, bool destroy) {
   Glob* live = nullptr;
   if (!widgets_.remove(widget, live)) return false;
   if (live && tabOrder_) {
-    if (auto* stop = dynamic_cast<TabOrderable*>(live)) tabOrder_->removeTabStop(*stop);
-    if (auto* host = dynamic_cast<TabOrderableHost*>(live)) {
+    if (auto* stop = Kw::crossCast<TabOrderable>(live)) tabOrder_->removeTabStop(*stop);
+    if (auto* host = Kw::crossCast<TabOrderableHost>(live)) {
       std::vector<TabOrderable*> stops;
       host->getTabOrderables(stops);
       for (TabOrderable* s : stops) tabOrder_->removeTabStop(s);

@@ -62,7 +62,7 @@ void Slider::init(bool isVertical) {
 
 void Slider::applySettings(const SliderInitArgs& args) {
   setValueRange(args.minValue, args.maxValue);
-  setPosition(args.position);
+  movePosition(args.position, false);
   if (args.hasPointOfInterest) setPointOfInterest(args.pointOfInterest);
   synchronousMessages = args.synchronousMessages;
   thumbVisible = args.thumbVisible;
@@ -118,6 +118,10 @@ bool Slider::setValueRange(double min, double max) {
 }
 
 bool Slider::setPosition(double v) {
+  return movePosition(v, true);
+}
+
+bool Slider::movePosition(double v, bool repaint) {
   if (!std::isfinite(v)) {
     diagWarning("Slider::setPosition: not a finite number, position kept\n");
     return false;
@@ -125,7 +129,7 @@ bool Slider::setPosition(double v) {
   if (std::fabs(position - v) < kSamePosition) return false;
   const double old = position;
   position = v;
-  redrawThumbMove(old, position);
+  if (repaint) redrawThumbMove(old, position);
   return true;
 }
 

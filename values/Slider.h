@@ -142,6 +142,9 @@ class Slider : public Glob, public ValWidget<double>, public GlobTabStop {
   // The band across the whole slider that the thumb at `value` paints.
   Kw::Box<int> thumbBand(double value) const;
   void redrawThumbMove(double from, double to);
+  // setPosition's checks and move; `repaint` false while being built (the whole slider was
+  // damaged when it was put on its parent).
+  bool movePosition(double v, bool repaint);
   int handleMouseEvent(Event* e);
   int handleKey(unsigned key);
   // Reports a user change (both reports) and publishes it; false when the slider is gone.

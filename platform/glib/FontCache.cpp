@@ -38,6 +38,7 @@ void FontCache::Shaper::release() {
 FontCache::FontCache() : own_(makeShaper(library_.config())) {}
 
 FontCache::~FontCache() {
+  lastFont_.reset();
   layouts_.clear();
   fonts_.clear();
   glyphs_.clear();
@@ -51,6 +52,14 @@ PangoContext* FontCache::systemContext() {
 }
 
 Kw::Ptr<ShapedFont> FontCache::get(const FontDesc& desc) {
+  if (lastFont_ && desc == lastAsked_) return lastFont_;
+  Kw::Ptr<ShapedFont> font = find(desc);
+  lastAsked_ = desc;
+  lastFont_ = font;
+  return font;
+}
+
+Kw::Ptr<ShapedFont> FontCache::find(const FontDesc& desc) {
   const FontDesc key = desc.resolved();
   if (auto it = fonts_.find(key); it != fonts_.end()) return it->second;
   String family = library_.family(key.face);
@@ -73,6 +82,7 @@ bool FontCache::addFontFile(const String& path) {
   // Fonts already handed out hold the old map through their context and stay usable.
   own_.release();
   own_ = makeShaper(library_.config());
+  lastFont_.reset();
   fonts_.clear();
   return true;
 }

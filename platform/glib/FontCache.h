@@ -54,6 +54,7 @@ class FontCache {
   };
   static Shaper makeShaper(FcConfig* config);
   PangoContext* systemContext();
+  Kw::Ptr<ShapedFont> find(const FontDesc& desc);
 
   FontLibrary library_;
   Shaper own_;
@@ -61,6 +62,10 @@ class FontCache {
   GlyphCache glyphs_;
   LayoutCache layouts_;
   std::unordered_map<FontDesc, Kw::Ptr<ShapedFont>, FontDescHash> fonts_;
+  // The last font asked for, as asked: controls built or drawn in a row nearly always ask for
+  // the same one, and this answers them without resolving and hashing the description.
+  FontDesc lastAsked_;
+  Kw::Ptr<ShapedFont> lastFont_;
   std::set<String> reported_;  // faces already reported as falling back
   int nextId_ = 1;
 };

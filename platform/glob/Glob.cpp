@@ -6,6 +6,7 @@
 #include "platform/glob/GlobRegistry.h"
 #include "platform/glob/RootGlob.h"
 #include "platform/glob/RuntimeClock.h"
+#include "platform/kw/CrossCast.h"
 #include "platform/misc/Diagnostics.h"
 
 namespace {
@@ -247,7 +248,7 @@ std::vector<Glob*> Glob::children() const {
 }
 
 RootGlob* Glob::root() const {
-  return dynamic_cast<RootGlob*>(canvas_.host());
+  return Kw::crossCast<RootGlob>(canvas_.host());
 }
 
 bool Glob::hasKbdFocus() const {

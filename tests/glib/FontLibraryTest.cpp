@@ -98,6 +98,11 @@ TEST_F(GlibApplicationFonts, AnAddedFileProvidesItsFamilies) {
   auto before = cache.standard();
   const int beforeWidth = before->textWidth(L"Settings");
   EXPECT_FALSE(cache.carries(family));
+  {
+    // Asked before the file is added: a stand-in, which must not outlive the addition.
+    Diagnostics::Capture fallback;
+    EXPECT_NE(cache.get(FontDesc(family, 13))->fileName(), copy.string());
+  }
 
   Diagnostics::Capture diag;
   ASSERT_TRUE(cache.addFontFile(copy.string()));

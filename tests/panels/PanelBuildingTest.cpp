@@ -6,7 +6,9 @@
 #include <memory>
 #include <vector>
 
+#include "panels/PanelGeometry.h"
 #include "panels/StandardPanel.h"
+#include "platform/backend/RootRenderer.h"
 #include "platform/testing/Harness.h"
 #include "tests/panels/PanelTestSupport.h"
 
@@ -47,6 +49,28 @@ TEST_F(PanelBuilding, ManyAdditionsEachLandAtTheirPlaceInTabOrder) {
   EXPECT_EQ(tabs.getTabStopTabOrder(60), 1u);
   EXPECT_EQ(tabs.getTabStopTabOrder(1), 2u);
   EXPECT_EQ(tabs.getHighestTabOrder(), 60u);
+}
+
+TEST_F(PanelBuilding, AnAdditionRepaintsTheNewcomerAndItsRingOnly) {
+  h.render();
+  h.renderer().takeChanged();
+  auto topDown = [&](const Kw::Box<int>& r) {
+    const int screenH = h.root().height();
+    return Kw::Box<int>(r.x0, screenH - r.y1, r.x1, screenH - r.y0);
+  };
+  auto* plain = new FocusChild(nullptr, 18, 8);
+  ASSERT_TRUE(panel->addWidget(plain, XY<int>(30, 40), OriginTopLeft));
+  h.render();
+  EXPECT_EQ(h.renderer().takeChanged(), topDown(plain->canvas()->rootRect()));
+
+  auto* ringed = new FocusChild(nullptr, 18, 8);
+  ASSERT_TRUE(panel->addWidget(ringed, XY<int>(100, 40), OriginTopLeft, SurroundFramed));
+  h.render();
+  const int s = PanelGeometry::surroundWidth(SurroundFramed);
+  ASSERT_GT(s, 0);
+  const Kw::Box<int> r = ringed->canvas()->rootRect();
+  EXPECT_EQ(h.renderer().takeChanged(),
+            topDown(Kw::Box<int>(r.x0 - s, r.y0 - s, r.x1 + s, r.y1 + s)));
 }
 
 TEST_F(PanelBuilding, MembershipAfterRemovalAndDeletionBehindTheBack) {
