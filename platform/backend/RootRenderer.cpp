@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "platform/misc/Diagnostics.h"
+#include "platform/os/LargeBlock.h"
 
 RootRenderer::RootRenderer(RootGlob& root) : root_(root), rootAlive_(&root) {
   makeSurface(root.canvas()->width(), root.canvas()->height());
@@ -15,11 +16,46 @@ RootRenderer::~RootRenderer() {
   cairo_surface_destroy(surface_);
 }
 
+namespace {
+
+// The screen's pixels live in a large block of their own; the image gives it back when it goes.
+struct ImageBlock {
+  void* pixels;
+  std::size_t bytes;
+};
+
+const cairo_user_data_key_t kImageBlockKey{};
+
+void releaseImageBlock(void* data) {
+  auto* block = static_cast<ImageBlock*>(data);
+  LargeBlock::release(block->pixels, block->bytes);
+  delete block;
+}
+
+cairo_surface_t* makeImage(int width, int height) {
+  const int stride = cairo_format_stride_for_width(CAIRO_FORMAT_ARGB32, width);
+  const std::size_t bytes = static_cast<std::size_t>(stride) * static_cast<std::size_t>(height);
+  void* pixels = stride > 0 ? LargeBlock::allocate(bytes) : nullptr;
+  if (!pixels) return cairo_image_surface_create(CAIRO_FORMAT_ARGB32, width, height);
+  cairo_surface_t* s = cairo_image_surface_create_for_data(
+      static_cast<unsigned char*>(pixels), CAIRO_FORMAT_ARGB32, width, height, stride);
+  auto* block = new ImageBlock{pixels, bytes};
+  if (cairo_surface_set_user_data(s, &kImageBlockKey, block, releaseImageBlock) !=
+      CAIRO_STATUS_SUCCESS) {
+    // Without the release the block would leak: an image of cairo's own instead.
+    cairo_surface_destroy(s);
+    releaseImageBlock(block);
+    return cairo_image_surface_create(CAIRO_FORMAT_ARGB32, width, height);
+  }
+  return s;
+}
+
+}  // namespace
+
 void RootRenderer::makeSurface(int width, int height) {
   session_.reset();
   if (surface_) cairo_surface_destroy(surface_);
-  surface_ =
-      cairo_image_surface_create(CAIRO_FORMAT_ARGB32, std::max(1, width), std::max(1, height));
+  surface_ = makeImage(std::max(1, width), std::max(1, height));
   session_ = std::make_unique<Glib::CairoPaintSession>(surface_);
   // A new image holds nothing yet: all of it must be painted.
   root_.canvas()->damage();

@@ -136,6 +136,22 @@ void Painter::line(XY<int> from, XY<int> to, const Colour& c, int lineWidth) {
 
 void Painter::verticalGradient(const Kw::Box<int>& box, const Colour& bottom, const Colour& top) {
   if (!session_ || box.empty()) return;
+  if (top.a >= 1 && bottom.a >= 1) {
+    // Opaque: each row is one colour, the gradient's at the row's middle, stored directly.
+    const Kw::Box<int> shown = box.intersection(bounds());
+    if (shown.empty()) return;
+    const pixman_box32_t whole = device(box);
+    const pixman_box32_t d = device(shown);
+    const double span = whole.y2 - whole.y1;
+    for (int y = d.y1; y < d.y2; ++y) {
+      const double t = (y + 0.5 - whole.y1) / span;
+      const Colour c(top.r + t * (bottom.r - top.r), top.g + t * (bottom.g - top.g),
+                     top.b + t * (bottom.b - top.b));
+      const pixman_box32_t row{d.x1, y, d.x2, y + 1};
+      fillBoxes(&row, 1, c);
+    }
+    return;
+  }
   cairo_t* cr = cairo();
   cairo_pattern_t* p = cairo_pattern_create_linear(0, cairoY(box.y1), 0, cairoY(box.y0));
   cairo_pattern_add_color_stop_rgba(p, 0, top.r, top.g, top.b, top.a);
