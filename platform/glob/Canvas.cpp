@@ -25,8 +25,10 @@ Canvas::~Canvas() {
   // Children still attached belong to someone else; they become unattached.
   for (Canvas* c : children_) c->parent_ = nullptr;
   children_.clear();
-  // A root canvas outlives nothing it could report to: its host is being destroyed.
-  if (!isRoot()) forgetSubtree();
+  // A root canvas outlives nothing it could report to: its host is being destroyed. Under a
+  // parent that is being torn down the Globs are already out of the registry (nothing of them
+  // is called any more) and the parent reports its whole subtree once, when it goes itself.
+  if (!isRoot() && !(parent_ && parent_->tearingDown_)) forgetSubtree();
   detachFromParent();
 }
 
