@@ -65,8 +65,17 @@ void Glob::setDefaultCursor(MouseCursorID id) {
 }
 
 void Glob::deleteChildren() {
-  while (!canvas_.children().empty()) {
-    Canvas* c = canvas_.children().back();
+  // A teardown touches each child once, and a child is a few cache lines of its own: the
+  // children a little further down the list are asked for ahead of their turn (their canvases
+  // first, then, once those have come, the objects their canvases name).
+  constexpr size_t kCanvasAhead = 8;
+  constexpr size_t kClientAhead = 4;
+  const std::vector<Canvas*>& kids = canvas_.children();
+  while (!kids.empty()) {
+    const size_t n = kids.size();
+    if (n > kCanvasAhead) __builtin_prefetch(kids[n - 1 - kCanvasAhead]);
+    if (n > kClientAhead) __builtin_prefetch(kids[n - 1 - kClientAhead]->client());
+    Canvas* c = kids.back();
     if (Glob* g = globOf(c)) {
       delete g;
     } else {
