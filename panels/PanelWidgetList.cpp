@@ -3,7 +3,7 @@
 #include "panels/StandardPanel.h"
 
 bool PanelWidgetList::mayHold(const Glob* widget) const {
-  return addresses_.contains(widget);
+  return addresses_ && addresses_->contains(widget);
 }
 
 WidgetDetails* PanelWidgetList::findLiveEntry(const Glob* widget) {
@@ -50,7 +50,8 @@ const WidgetDetails& PanelWidgetList::insert(const WidgetDetails& d, Glob* inser
           is_good_glob_ptr(insertAfter) ? findLive(insertAfter) : nullptr) {
     at = list_.begin() + (after - list_.data()) + 1;
   }
-  addresses_.add(d.address);
+  if (!addresses_) addresses_ = std::make_unique<Kw::AddressCounts>();
+  addresses_->add(d.address);
   WidgetDetails& added = *list_.insert(at, d);
   if (loose) {
     XY<int> corner;
@@ -71,7 +72,7 @@ bool PanelWidgetList::remove(const Glob* widget, Glob*& live) {
   }
   const Glob* address = list_[index].address;
   list_.erase(list_.begin() + static_cast<std::ptrdiff_t>(index));
-  addresses_.remove(address);
+  addresses_->remove(address);
   return true;
 }
 
@@ -168,6 +169,6 @@ void PanelWidgetList::placeAll() {
 std::vector<WidgetDetails> PanelWidgetList::takeAll() {
   std::vector<WidgetDetails> out;
   out.swap(list_);
-  addresses_.clear();
+  addresses_.reset();
   return out;
 }

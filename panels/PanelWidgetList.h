@@ -7,6 +7,7 @@
 //
 // An entry whose child was deleted behind the panel's back stays, with a null widget, until
 // it is removed by its old address; every placement skips it.
+#include <memory>
 #include <vector>
 
 #include "panels/WidgetDetails.h"
@@ -77,6 +78,7 @@ class PanelWidgetList {
 
   StandardPanel& panel_;
   std::vector<WidgetDetails> list_;
-  // How many entries were made for each address (dead ones included).
-  Kw::AddressCounts addresses_;
+  // How many entries were made for each address (dead ones included); made with the first,
+  // as most panels (every check box and text box is one) never list a widget.
+  std::unique_ptr<Kw::AddressCounts> addresses_;
 };

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <climits>
 #include <cstdlib>
+#include <utility>
 
 #include "platform/glib/FontCache.h"
 #include "platform/glib/Painter.h"
@@ -30,16 +31,21 @@ int clampToInt(int64_t v) {
 // --- Construction ---
 
 TextBox::TextBox(const InitArgs& args) : TextBoxBase(args.info) {
-  apply(args);
+  apply(args, args.text);
+}
+
+TextBox::TextBox(InitArgs&& args) : TextBoxBase(args.info) {
+  WString text = std::move(args.text);
+  apply(args, std::move(text));
 }
 
 TextBox::TextBox(unsigned short width, unsigned short height, const Palette& palette,
                  Canvas* parent)
     : TextBoxBase(width, height, palette, parent) {
-  apply(InitArgs());
+  apply(InitArgs(), WString());
 }
 
-void TextBox::apply(const InitArgs& args) {
+void TextBox::apply(const InitArgs& args, WString text) {
   leftMargin_ = args.leftMargin;
   rightMargin_ = args.rightMargin;
   alignment_ = args.alignment;
@@ -51,7 +57,7 @@ void TextBox::apply(const InitArgs& args) {
   setCharacters(args.characters, args.restriction);
   setGhostLabel(args.ghostLabel);
   ruler_.setFont(displayFont());
-  model_.setText(args.text, TextEditModel::SeekMethod::StartOfText);
+  model_.setText(std::move(text), TextEditModel::SeekMethod::StartOfText);
   relayout();
 }
 

@@ -85,6 +85,8 @@ class TextBox : public TextBoxBase {
   };
 
   explicit TextBox(const InitArgs& args);
+  // The same, taking the text over rather than copying it.
+  explicit TextBox(InitArgs&& args);
   TextBox(unsigned short width, unsigned short height, const Palette& palette, Canvas* parent);
 
   // --- Contents ---
@@ -173,7 +175,7 @@ class TextBox : public TextBoxBase {
     bool operator==(const EditState& o) const = default;
   };
 
-  void apply(const InitArgs& args);
+  void apply(const InitArgs& args, WString text);
   EditState editState() const;
   // Brings the ruler, the scroll offset and the caret up to date with the model.
   void relayout();

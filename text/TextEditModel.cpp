@@ -1,6 +1,7 @@
 #include "text/TextEditModel.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "platform/glob/KeyCodes.h"
 #include "platform/kw/CharClassifier.h"
@@ -20,13 +21,10 @@ WString TextEditModel::textRange(int from, int to) const {
   return text_.substr(lo, hi - lo);
 }
 
-bool TextEditModel::setText(const WString& text, SeekMethod caretTo) {
+bool TextEditModel::setText(WString text, SeekMethod caretTo) {
   if (text_ == text && hasSaved_ && savedText() == text && !modified_) return false;
-  if (text.size() > kMaxLength) {
-    text_.assign(text, 0, kMaxLength);
-  } else {
-    text_ = text;
-  }
+  if (text.size() > kMaxLength) text.resize(kMaxLength);
+  text_ = std::move(text);
   ++revision_;
   saveText();
   modified_ = false;

@@ -80,7 +80,8 @@ class TextEditModel {
   // Replaces the contents and the saved text, caret to `caretTo` (the end or the start), no
   // selection, not modified, no undo or redo. Returns false (and changes nothing) when the
   // text, the saved text and the unmodified state are already so.
-  bool setText(const WString& text, SeekMethod caretTo = SeekMethod::EndOfText);
+  // The text is taken over (moved in) when given a temporary.
+  bool setText(WString text, SeekMethod caretTo = SeekMethod::EndOfText);
   // Counts every change of the text, so that a caller can tell whether a key changed it
   // without keeping a copy.
   std::uint64_t revision() const { return revision_; }

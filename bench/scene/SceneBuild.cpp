@@ -1,5 +1,7 @@
 #include "bench/scene/SceneBuild.h"
 
+#include <utility>
+
 #include "bench/NumberedLabel.h"
 
 #include "buttons/Button.h"
@@ -36,7 +38,7 @@ Glob* makeControl(int i, const GlobCreationInfo& info) {
       TextBox::InitArgs args;
       args.info = info;
       args.text = labelOf(i);
-      return new TextBox(args);
+      return new TextBox(std::move(args));
     }
   }
   return nullptr;

@@ -28,6 +28,10 @@ struct State {
   uint32_t live = 0;
   Node** nodes = nullptr;                  // 2^16 entries, made on first use
   std::vector<const void*> highAddresses;  // beyond 48 bits: a plain list
+  // Globs come and go near one another: the leaf found last answers most lookups. Leaves are
+  // never given back, so the remembered one stays valid.
+  uintptr_t lastLeafKey = ~uintptr_t{0};
+  Leaf* lastLeaf = nullptr;
 };
 
 // Made once and kept to the end of the process: Globs may outlive static destruction.
@@ -43,6 +47,9 @@ bool isHigh(uintptr_t a) {
 // The word and bit of an address; null when its leaf was never made (and `make` is false).
 uint64_t* wordOf(uintptr_t a, uint64_t& mask, bool make) {
   State& s = state();
+  const size_t granule = (a & ((uintptr_t{1} << kLeafShift) - 1)) >> kGranuleShift;
+  mask = uint64_t{1} << (granule % 64);
+  if ((a >> kLeafShift) == s.lastLeafKey) return &s.lastLeaf->bits[granule / 64];
   if (!s.nodes) {
     if (!make) return nullptr;
     s.nodes = static_cast<Node**>(std::calloc(size_t{1} << kNodeBits, sizeof(Node*)));
@@ -59,8 +66,8 @@ uint64_t* wordOf(uintptr_t a, uint64_t& mask, bool make) {
     if (!make) return nullptr;
     leaf = static_cast<Leaf*>(std::calloc(1, sizeof(Leaf)));
   }
-  const size_t granule = (a & ((uintptr_t{1} << kLeafShift) - 1)) >> kGranuleShift;
-  mask = uint64_t{1} << (granule % 64);
+  s.lastLeafKey = a >> kLeafShift;
+  s.lastLeaf = leaf;
   return &leaf->bits[granule / 64];
 }
 
