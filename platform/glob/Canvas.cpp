@@ -220,17 +220,24 @@ void Canvas::damage() {
 
 void Canvas::damage(const Kw::Box<int>& localArea) {
   // One walk to the root: the area moves into each parent's coordinates and is clipped by each
-  // canvas on the way, and an unmapped canvas on the way means nothing shows.
-  Kw::Box<int> area = localArea;
+  // canvas on the way, and an unmapped canvas on the way means nothing shows. Kept in four
+  // plain integers: this runs for every control made, moved or changed.
+  int x0 = localArea.x0, y0 = localArea.y0, x1 = localArea.x1, y1 = localArea.y1;
   for (const Canvas* c = this; c; c = c->parent_) {
     if (!c->mapped_) return;
-    area = area.intersection(c->localBounds());
-    if (area.empty()) return;
+    x0 = std::max(x0, 0);
+    y0 = std::max(y0, 0);
+    x1 = std::min(x1, c->rect_.width());
+    y1 = std::min(y1, c->rect_.height());
+    if (x1 <= x0 || y1 <= y0) return;
     if (c->isRoot()) {
-      if (CanvasHost* h = c->rare_->host) h->canvasDamaged(area);
+      if (CanvasHost* h = c->rare_->host) h->canvasDamaged(Kw::Box<int>(x0, y0, x1, y1));
       return;
     }
-    area = area.translated(c->rect_.x0, c->rect_.y0);
+    x0 += c->rect_.x0;
+    x1 += c->rect_.x0;
+    y0 += c->rect_.y0;
+    y1 += c->rect_.y0;
   }
 }
 
